@@ -1,0 +1,152 @@
+#pragma once
+
+#include "game/GameRecord.h"
+#include "presentation/ImageHolder.h"
+
+#include <QRect>
+#include <QString>
+#include <QWidget>
+
+#include <functional>
+
+class QListWidget;
+class QPushButton;
+
+// Command ids of the six action buttons.
+enum ActionCommand : int {
+    kCmdDeal = 1,
+    kCmdSendToCrib = 3,
+    kCmdScorePlayerHand = 4,
+    kCmdScoreOpponentHand = 5,
+    kCmdOk = 6,
+    kCmdScoreCrib = 7,
+};
+
+// The game window. It holds the whole game record; every game operation is a
+// member, defined in the folder of the subsystem it belongs to:
+// game/ (deal, input, log, pegs), scoring/ (counting, show, pegging),
+// play/ (the play and the computer), presentation/ (holes, layout, images,
+// painting), settings/ (stored values, Options).
+class GameBoard : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit GameBoard(QWidget* parent = nullptr);
+    ~GameBoard() override;
+
+    GameRecord record;
+
+    // Where the deal draws its numbers: std::rand, seeded once at construction.
+    // Tests put a scripted source here to stack the deck.
+    std::function<int()> randomSource;
+
+    // --- game/: dealing and the crib
+    void OnDeal();
+    void DealHand();
+    void SortByRank(int first, int last);
+    void OnSendToCrib();
+    void NewGame();
+    void SyncCardSprites();
+
+    // --- game/: phases, action buttons and input
+    void OnCommand(int id);
+    void OnLButtonDown(QPoint point);
+    void OnKeyDown(int key);
+    void OnKeyUp(int key);
+    void OnCardTap(int position, CardSprite& sprite);
+    int SelectedCount() const;
+    void ShowOk();
+    void ShowScoreOpponentHand();
+    void ShowScorePlayerHand();
+    void ShowScoreCrib();
+    // Whether an action button is shown; false before the buttons exist.
+    bool IsButtonShown(int id) const;
+    // The action button of a command id, or null before the first paint.
+    QPushButton* ActionButton(int id) const;
+    // The hand position (1..6) a key selects, or 0.
+    static int HandPositionKey(int key);
+
+    // --- game/: message log
+    void LogMessage(const QString& text);
+    QListWidget* MessageLog() const { return messageLog; }
+
+    // --- game/: score track and pegs
+    int PlayerScore() const { return record.playerFrontHole; }
+    int OpponentScore() const { return record.opponentFrontHole; }
+    void MovePlayerPegs(int points);
+    void MoveOpponentPegs(int points);
+    void SetPlayerBackHole(int hole);
+    void SetPlayerFrontHole(int hole);
+    void SetOpponentBackHole(int hole);
+    void SetOpponentFrontHole(int hole);
+    void UpdatePegRects(bool invalidate);
+    void RefreshCount();
+
+    // --- scoring/
+    int CountHand(const CardId cards[5]) const;
+    void ScorePlayerHand();
+    void ScoreOpponentHand();
+    void ScoreCrib();
+    void PegPoints(int side, int points, const QString& suffix);
+
+    // --- play/
+    void StartPlay();
+    void PlayerLaysCard(CardSprite& sprite);  // the play half of a card tap
+    void PlayerPlaysCard(int rank1);
+    void ComputerTurn();
+    void ComputerPlaysCard(int rank1);
+    bool PlayerCannotPlay() const;
+    bool ComputerCannotPlay() const;
+    void OnOk();
+    void ChooseComputerDiscards();
+    int ChooseComputerCard() const;  // hand position 1..4, or 0 for none
+    static double DiscardValue(int rank1a, int rank1b);
+
+    // --- presentation/
+    void BuildHoleMap();
+    void ResetTable();
+    QRect ScaledRect(const Rect& r) const;
+    void Invalidate(const Rect& r);
+    void LoadImages();
+    void ReloadBoardBitmap();
+    // The scale factors for a game window of this size, each at least 1.
+    static int ScaleFactorX(int width);
+    static int ScaleFactorY(int height);
+
+    BitmapInfo boardInfo;
+    BitmapInfo cardInfo;
+    BitmapInfo pegInfo;
+    ImageHolder boardBitmap;
+    ImageHolder suitFaceBitmaps[4];
+    ImageHolder backBitmap;
+    ImageHolder rankGlyphBitmap;
+    ImageHolder playerPegBitmap;
+    ImageHolder opponentPegBitmap;
+    ImageHolder digitBitmap;
+
+    // --- settings/
+    void LoadSettings();
+    void SaveSettings();
+    void OnOptions();
+    void ApplyBoardStyle(int style);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void keyReleaseEvent(QKeyEvent* event) override;
+
+private:
+    void FirstPaintSetup();
+    void CreateActionButtons();
+    void PaintCard(class QPainter& painter, const CardSprite& sprite);
+    void PaintImage(class QPainter& painter, const QImage& image, QRect source, QPoint target);
+
+    QPushButton* dealButton = nullptr;
+    QPushButton* sendToCribButton = nullptr;
+    QPushButton* scorePlayerHandButton = nullptr;
+    QPushButton* scoreOpponentHandButton = nullptr;
+    QPushButton* scoreCribButton = nullptr;
+    QPushButton* okButton = nullptr;
+    QListWidget* messageLog = nullptr;
+};

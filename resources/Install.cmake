@@ -1,0 +1,1 @@
+# (desktop entry and icons are installed here)

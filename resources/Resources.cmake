@@ -1,0 +1,1 @@
+# (the generated bitmaps are added to vennick_core here)

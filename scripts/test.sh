@@ -1,0 +1,17 @@
+#!/usr/bin/env bash
+# Builds with warnings as errors and runs the whole test suite, then builds and
+# runs it again under AddressSanitizer and UndefinedBehaviorSanitizer.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+bash scripts/setup.sh
+jobs=$(nproc)
+
+cmake -S . -B build/sanitize -G Ninja -DCMAKE_BUILD_TYPE=Debug -DVENNICK_WERROR=ON -DVENNICK_SANITIZE=ON
+cmake --build build/sanitize -j "$jobs"
+echo "== Test suite under AddressSanitizer and UndefinedBehaviorSanitizer"
+ctest --test-dir build/sanitize --output-on-failure -j "$jobs"
+
+cmake -S . -B build/check -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo -DVENNICK_WERROR=ON
+cmake --build build/check -j "$jobs"
+echo "== Test suite"
+ctest --test-dir build/check --output-on-failure -j "$jobs"

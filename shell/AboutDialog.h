@@ -1,0 +1,11 @@
+#pragma once
+
+#include <QDialog>
+
+// The About box: the program's icon, its name and an OK button.
+class CAboutDlg : public QDialog {
+    Q_OBJECT
+
+public:
+    explicit CAboutDlg(QWidget* parent = nullptr);
+};

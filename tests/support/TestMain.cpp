@@ -1,0 +1,45 @@
+#include "support/TestMain.h"
+
+#include <QApplication>
+#include <QSettings>
+#include <QStandardPaths>
+#include <QTemporaryDir>
+
+#include <cstdio>
+#include <utility>
+#include <vector>
+
+namespace {
+
+std::vector<std::pair<const char*, std::function<int(int, char**)>>>& Registry()
+{
+    static std::vector<std::pair<const char*, std::function<int(int, char**)>>> registry;
+    return registry;
+}
+
+} // namespace
+
+bool RegisterTestClass(const char* name, std::function<int(int, char**)> run)
+{
+    Registry().emplace_back(name, std::move(run));
+    return true;
+}
+
+int main(int argc, char** argv)
+{
+    // Settings never touch the user's own: the whole run uses a fresh folder.
+    QTemporaryDir configHome;
+    qputenv("XDG_CONFIG_HOME", configHome.path().toUtf8());
+    QStandardPaths::setTestModeEnabled(true);
+    QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, configHome.path());
+
+    QApplication app(argc, argv);
+    int failed = 0;
+    for (auto& [name, run] : Registry()) {
+        if (run(argc, argv) != 0) {
+            std::fprintf(stderr, "FAILED: %s\n", name);
+            ++failed;
+        }
+    }
+    return failed == 0 ? 0 : 1;
+}
