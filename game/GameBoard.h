@@ -63,6 +63,8 @@ public:
     bool IsButtonShown(int id) const;
     // The action button of a command id, or null before the first paint.
     QPushButton* ActionButton(int id) const;
+    // Shows or hides one action button; nothing before the buttons exist.
+    void SetButtonShown(QPushButton* button, bool shown);
     // The hand position (1..6) a key selects, or 0.
     static int HandPositionKey(int key);
 
@@ -80,6 +82,7 @@ public:
     void SetOpponentBackHole(int hole);
     void SetOpponentFrontHole(int hole);
     void UpdatePegRects(bool invalidate);
+    void InvalidatePegRects();
     void RefreshCount();
 
     // --- scoring/
@@ -137,6 +140,9 @@ protected:
     void keyReleaseEvent(QKeyEvent* event) override;
 
 private:
+    void PlaceCountRect();
+    void MovePegs(int points, void (GameBoard::*setBack)(int), void (GameBoard::*setFront)(int),
+                  const int32_t& frontHole);
     void FirstPaintSetup();
     void CreateActionButtons();
     void PaintCard(class QPainter& painter, const CardSprite& sprite);

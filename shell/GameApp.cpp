@@ -1,0 +1,26 @@
+#include "shell/GameApp.h"
+
+#include "shell/MainFrame.h"
+
+#include <QIcon>
+
+CGameApp::CGameApp(int& argc, char** argv)
+    : QApplication(argc, argv)
+{
+    setApplicationName(QStringLiteral("Vennick"));
+    setOrganizationName(QStringLiteral("Quorvan"));
+    QIcon icon;
+    for (int size : {16, 32, 256})
+        icon.addFile(QStringLiteral(":/icons/vennick-%1.png").arg(size), QSize(size, size));
+    setWindowIcon(icon);
+}
+
+CGameApp::~CGameApp() = default;
+
+bool CGameApp::InitInstance()
+{
+    mainFrame = std::make_unique<CMainFrame>();
+    mainFrame->show();
+    mainFrame->Board()->setFocus();
+    return true;
+}

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "game/GameBoard.h"
+
+#include <QMainWindow>
+#include <QSize>
+
+class QAction;
+class QMenu;
+
+// The frame window: the "Tools" menu, the New and Exit keys, and the game
+// window as its only central child, which always holds the keyboard focus.
+class CMainFrame : public QMainWindow {
+    Q_OBJECT
+
+public:
+    explicit CMainFrame(QWidget* parent = nullptr);
+
+    GameBoard* Board() { return &board; }
+    QMenu* ToolsMenu() const { return toolsMenu; }
+
+    // The largest whole scale factor (at least 1) at which a game window of
+    // 240 s x (320 s - 52) plus the frame's own chrome fits the available area.
+    static int ChooseScale(QSize available, QSize chrome);
+    // The game window's size for a scale factor.
+    static QSize GameWindowSize(int scale);
+
+private:
+    void OnAbout();
+    void OnOptionsCommand();
+    void OnExit();
+
+    GameBoard board;
+    QMenu* toolsMenu = nullptr;
+};

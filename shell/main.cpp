@@ -1,0 +1,9 @@
+#include "shell/GameApp.h"
+
+int main(int argc, char** argv)
+{
+    CGameApp app(argc, argv);
+    if (!app.InitInstance())
+        return 1;
+    return CGameApp::exec();
+}
