@@ -1,0 +1,156 @@
+#include "settings/Settings.h"
+
+#include "game/GameBoard.h"
+
+#include <QFileInfo>
+#include <QSettings>
+#include <QVariant>
+
+#include <cerrno>
+#include <cstdint>
+#include <limits>
+#include <optional>
+#include <vector>
+
+#if defined(Q_OS_UNIX)
+#include <pwd.h>
+#include <unistd.h>
+#endif
+
+namespace {
+
+const QString kOrganisation = QStringLiteral("Quorvan");
+const QString kApplication = QStringLiteral("Vennick");
+
+// The store holds four small numbers; anything much larger is not ours, and
+// reading it whole would stall the start or exhaust memory.
+constexpr qint64 kLargestStore = 64 * 1024;
+
+enum class StoreState {
+    Present,   // readable, holding values
+    Missing,   // not there yet (or empty): to be created
+    Unusable,  // there, but neither readable nor replaceable by us
+};
+
+// The store's file, found without reading it: a settings object under another
+// application name tells the folder, so the size can be checked first.
+QString StoreFileName()
+{
+    const QSettings probe(QSettings::NativeFormat, QSettings::UserScope, kOrganisation,
+                          kApplication + QStringLiteral("-probe"));
+    const QFileInfo probeFile(probe.fileName());
+    return probeFile.absolutePath() + QLatin1Char('/') + kApplication + QLatin1Char('.') + probeFile.suffix();
+}
+
+// Opens the store into settings when it is there and sane; says what was found.
+StoreState OpenStore(std::optional<QSettings>& settings)
+{
+    const QFileInfo file(StoreFileName());
+    if (file.exists() || file.isSymLink()) {
+        // A folder, a device or a pipe would block or fail the read; a huge file
+        // is left alone as well, so nothing in it is overwritten.
+        if (!file.isFile() || !file.isReadable() || file.size() > kLargestStore)
+            return StoreState::Unusable;
+    }
+    settings.emplace(QSettings::NativeFormat, QSettings::UserScope, kOrganisation, kApplication);
+    // Only the user's own store counts, not organisation or system-wide files.
+    settings->setFallbacksEnabled(false);
+    const QStringList keys = settings->allKeys();
+    if (settings->status() == QSettings::AccessError)
+        return StoreState::Unusable;
+    return keys.isEmpty() ? StoreState::Missing : StoreState::Present;
+}
+
+// Replaces the store's content with the four values. A damaged file is
+// rewritten clean; a store that cannot be written is left as it is.
+bool WriteStore(QSettings& settings, const GameRecord& r)
+{
+    settings.clear();
+    settings.setValue(QStringLiteral("For"), r.gamesFor);
+    settings.setValue(QStringLiteral("Against"), r.gamesAgainst);
+    settings.setValue(QStringLiteral("Crib"), r.savedPlayerCrib);
+    settings.setValue(QStringLiteral("Board"), r.boardStyle);
+    settings.sync();
+    return settings.status() != QSettings::AccessError;
+}
+
+// Reads a value into field when it is a whole number that fits 32 bits;
+// anything else counts as missing and leaves the field as it was.
+bool ReadInt32(const QSettings& settings, const QString& name, int32_t& field)
+{
+    const QVariant value = settings.value(name);
+    if (!value.isValid())
+        return false;
+    bool ok = false;
+    const qlonglong number = value.toString().toLongLong(&ok, 10);
+    if (!ok || number < std::numeric_limits<int32_t>::min() || number > std::numeric_limits<int32_t>::max())
+        return false;
+    field = static_cast<int32_t>(number);
+    return true;
+}
+
+} // namespace
+
+QString OwnerNameFromGecos(const QByteArray& gecos)
+{
+    const qsizetype comma = gecos.indexOf(',');
+    const QString name = QString::fromLocal8Bit(comma < 0 ? gecos : gecos.left(comma)).trimmed();
+    return name.isEmpty() ? kDefaultOwnerName : name;
+}
+
+QString SystemOwnerName()
+{
+#if defined(Q_OS_UNIX)
+    const long suggested = sysconf(_SC_GETPW_R_SIZE_MAX);
+    std::vector<char> buffer(suggested > 0 ? static_cast<size_t>(suggested) : 1024);
+    passwd entry{};
+    passwd* found = nullptr;
+    int error = 0;
+    while ((error = getpwuid_r(getuid(), &entry, buffer.data(), buffer.size(), &found)) == ERANGE
+           && buffer.size() < 1024 * 1024)
+        buffer.resize(buffer.size() * 2);
+    if (error == 0 && found != nullptr && found->pw_gecos != nullptr)
+        return OwnerNameFromGecos(QByteArray(found->pw_gecos));
+#endif
+    return kDefaultOwnerName;
+}
+
+void GameBoard::LoadSettings()
+{
+    GameRecord& r = record;
+    r.ownerName = kDefaultOwnerName;
+    r.gamesFor = 0;
+    r.gamesAgainst = 0;
+    r.boardStyle = 1;
+
+    std::optional<QSettings> settings;
+    StoreState state = OpenStore(settings);
+    if (state == StoreState::Missing)
+        state = WriteStore(*settings, r) ? StoreState::Present : StoreState::Unusable;
+
+    if (state == StoreState::Present) {
+        ReadInt32(*settings, QStringLiteral("For"), r.gamesFor);
+        ReadInt32(*settings, QStringLiteral("Against"), r.gamesAgainst);
+        int32_t crib = 0;
+        // The crib alternates by inverting 0 and 1; a damaged value would stop
+        // it, so anything but 0 means the user's.
+        if (ReadInt32(*settings, QStringLiteral("Crib"), crib))
+            r.savedPlayerCrib = crib != 0 ? 1 : 0;
+        ReadInt32(*settings, QStringLiteral("Board"), r.boardStyle);
+        r.ownerName = SystemOwnerName();
+    }
+    // Also without a store, so the first crib still alternates from game to game.
+    r.playerCrib = r.savedPlayerCrib;
+
+    LogMessage(r.ownerName + QStringLiteral(": ") + QString::number(r.gamesFor));
+    LogMessage(QStringLiteral("Opponent: ") + QString::number(r.gamesAgainst));
+    LogMessage(QStringLiteral("Click Deal to start a new game."));
+}
+
+void GameBoard::SaveSettings()
+{
+    std::optional<QSettings> settings;
+    // A store that is missing is created by the next load, not here.
+    if (OpenStore(settings) == StoreState::Present)
+        WriteStore(*settings, record);
+}
