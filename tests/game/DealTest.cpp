@@ -62,7 +62,7 @@ private slots:
         QString previousCrib;
         for (int n = 0; n < 300; ++n) {
             board->NewGame();
-            const int before = LogLines(*board).size();
+            const auto before = LogLines(*board).size();
             board->OnDeal();
             const GameRecord& r = board->record;
             std::set<CardId> cards(std::begin(r.deal), std::end(r.deal));

@@ -33,6 +33,7 @@ private slots:
         QCOMPARE(board->OpponentScore(), 0);
 
         // The computer's pegs follow the same rule on their own track.
+        board->NewGame();
         for (int n : moves)
             board->MoveOpponentPegs(n);
         QCOMPARE(board->OpponentScore(), front);
