@@ -1,0 +1,89 @@
+#include "game/GameBoard.h"
+
+#include <cstdint>
+#include <limits>
+
+namespace {
+
+// The tally is kept across runs; a counter at its ceiling stays there rather
+// than wrapping to a negative number of games.
+int32_t AddGames(int32_t tally, int32_t games)
+{
+    constexpr int32_t kMax = std::numeric_limits<int32_t>::max();
+    return tally > kMax - games ? kMax : tally + games;
+}
+
+// A win counts 1 game, 2 when the loser has 90 or less, 4 when 60 or less.
+int32_t GamesForWin(int loserScore)
+{
+    int32_t games = 1;
+    if (loserScore <= 90)
+        games += 1;
+    if (loserScore <= 60)
+        games += 2;
+    return games;
+}
+
+bool IsShowPhase(int32_t phase)
+{
+    return phase == kPhaseHandCounted || phase == kPhaseCribCounted || phase == kPhasePlayOver;
+}
+
+} // namespace
+
+void GameBoard::PegPoints(int side, int points, const QString& suffix)
+{
+    const QString announced = (side == kSidePlayer ? QStringLiteral("You peg ") : QStringLiteral("Opponent pegs "))
+        + QString::number(points) + suffix + QLatin1Char('.');
+
+    if (points <= 0) {
+        // During the play a card that scores nothing passes in silence; in the
+        // show every count is announced, even a nought.
+        if (points == 0 && IsShowPhase(record.phase))
+            LogMessage(announced);
+    } else if (side == kSidePlayer) {
+        MovePlayerPegs(points);
+        LogMessage(announced);
+        // The computer waits until the user has seen the points.
+        if (record.phase < kPhaseCountStart)
+            ShowOk();
+    } else {
+        // When the computer's scoring card leaves nobody able to play, its
+        // last-card point rides along with the card's own points (unannounced).
+        int pegged = points;
+        if (record.phase < kPhaseCountStart && PlayerCannotPlay() && ComputerCannotPlay() && points != 1
+            && record.runningCount < 31)
+            pegged = points + 1;
+        MoveOpponentPegs(pegged);
+        LogMessage(announced);
+        if (record.phase < kPhaseCountStart && PlayerCannotPlay()) {
+            if (!ComputerCannotPlay()) {
+                ShowOk();
+            } else {
+                record.runningCount = 0;
+                record.playSequence.entries[0] = -1;
+            }
+        }
+    }
+
+    if (PlayerScore() == kGameHole && record.gameOver == 0) {
+        record.gameOver = 1;
+        LogMessage(QStringLiteral("You won."));
+        LogMessage(QStringLiteral("Please click New to play again."));
+        record.gamesFor = AddGames(record.gamesFor, GamesForWin(OpponentScore()));
+        SaveSettings();
+    }
+    if (OpponentScore() == kGameHole && record.gameOver == 0) {
+        record.gameOver = 1;
+        LogMessage(QStringLiteral("You lost."));
+        LogMessage(QStringLiteral("Please click New to play again."));
+        record.gamesAgainst = AddGames(record.gamesAgainst, GamesForWin(PlayerScore()));
+        SaveSettings();
+    }
+    if (PlayerScore() == kGameHole || OpponentScore() == kGameHole) {
+        // Only New starts another game; "Deal" keeps whatever state it had.
+        for (int id : {kCmdSendToCrib, kCmdScorePlayerHand, kCmdScoreOpponentHand, kCmdScoreCrib, kCmdOk})
+            SetButtonShown(ActionButton(id), false);
+        record.phase = kPhaseGameOver;
+    }
+}
