@@ -33,6 +33,9 @@ int main(int argc, char** argv)
     QStandardPaths::setTestModeEnabled(true);
     QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, configHome.path());
 
+    // Real widgets and input without a display, also when run by hand.
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
     QApplication app(argc, argv);
     int failed = 0;
     for (auto& [name, run] : Registry()) {
