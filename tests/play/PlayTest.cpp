@@ -14,6 +14,7 @@ private slots:
     void computerRunsOnToThirtyOneAndUserLeads();
     void goIsRepeatedUntilUserPegsIt();
     void computerLastCardPointIsNotAnnounced();
+    void computerGoLetsUserLead();
     void computerWaitsForOkAfterScoringWhileUserIsStuck();
     void userLastCardGoEndsThePlay();
     void cardPassingThirtyOneIsRefused();
@@ -162,6 +163,41 @@ void PlayTest::computerLastCardPointIsNotAnnounced()
     QCOMPARE(r.runningCount, 0);
     QVERIFY(SequenceRanks(b).isEmpty());
     QCOMPARE(r.phase, int32_t(kPhasePlayOver));
+    QCOMPARE(ShownButtons(b), QList<int>{kCmdScorePlayerHand});
+}
+
+void PlayTest::computerGoLetsUserLead()
+{
+    auto board = MakeBoard();
+    GameBoard& b = *board;
+    const GameRecord& r = b.record;
+    StartDeal(b, false,
+              {{Card(1, 4), Card(7, 4), Card(10, 2), Card(11, 2)},
+               {Card(2, 3), Card(3, 3)},
+               {Card(8, 3), Card(11, 1), Card(12, 1), Card(10, 1)},
+               {Card(4, 2), Card(5, 2)},
+               Card(6, 4)});
+    const qsizetype mark = LogLines(b).size();
+
+    LayCard(b, Card(1, 4));   // A, 8: 9
+    LayCard(b, Card(7, 4));   // 7, J: 26, and neither side has a card that fits
+    QCOMPARE(LinesSince(b, mark), QStringList{"Opponent pegs 1 for a go."});
+    QCOMPARE(b.OpponentScore(), 1);
+    QCOMPARE(r.runningCount, 0);
+    // The computer laid the last card, so the user leads without a pause.
+    QVERIFY(ShownButtons(b).isEmpty());
+    QCOMPARE(r.opponentPlayIndex, 3);
+
+    LayCard(b, Card(10, 2));  // 10, 10: 20, a pair
+    QCOMPARE(LinesSince(b, mark).last(), QStringLiteral("Opponent pegs 2."));
+    QCOMPARE(b.OpponentScore(), 3);  // the user's jack still fits: no last card
+    QVERIFY(ShownButtons(b).isEmpty());
+    LayCard(b, Card(11, 2));  // 30; the computer's Q does not fit
+    QCOMPARE(LinesSince(b, mark).last(), QStringLiteral("You peg 1 for a go."));
+    QCOMPARE(ShownButtons(b), QList<int>{kCmdOk});
+    ClickButton(b, kCmdOk);   // the computer leads its Q alone and takes the go
+    QCOMPARE(LinesSince(b, mark).last(), QStringLiteral("Opponent pegs 1 for a go."));
+    QCOMPARE(b.OpponentScore(), 4);
     QCOMPARE(ShownButtons(b), QList<int>{kCmdScorePlayerHand});
 }
 
