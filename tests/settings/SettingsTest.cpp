@@ -154,6 +154,20 @@ private slots:
         }
     }
 
+    void unusableStoreStillAlternates()
+    {
+        TempStore store;
+        QVERIFY(QDir().mkpath(store.FileName()));
+        auto board = MakeBoard(1, true);
+        QCOMPARE(DealAndTellCrib(*board), QStringLiteral("Opponent's Crib."));
+        board->NewGame();
+        QCOMPARE(LogLines(*board), TallyLines(QStringLiteral("You"), 0, 0));
+        QCOMPARE(DealAndTellCrib(*board), QStringLiteral("Your Crib."));
+        board->NewGame();
+        QCOMPARE(DealAndTellCrib(*board), QStringLiteral("Opponent's Crib."));
+        QVERIFY(QFileInfo(store.FileName()).isDir());
+    }
+
     void badValues_data()
     {
         QTest::addColumn<QByteArray>("content");
