@@ -35,9 +35,11 @@ constexpr int Choose(int n, int k) { return kChoose[n][k]; }
 
 constexpr int Multisets(int size) { return Choose(kRanks + size - 1, size); }
 
-// A few ranks in ascending order (insertion sort; compile time only).
+// Puts a few ranks in ascending order (insertion sort; compile time only).
+// Plain arrays throughout: the compiler evaluates them far faster than
+// std::array.
 template <size_t N>
-constexpr std::array<int, N> Sorted(std::array<int, N> rank)
+constexpr void SortRanks(int (&rank)[N])
 {
     for (size_t i = 1; i < N; ++i)
         for (size_t j = i; j > 0 && rank[j - 1] > rank[j]; --j) {
@@ -45,14 +47,13 @@ constexpr std::array<int, N> Sorted(std::array<int, N> rank)
             rank[j] = rank[j - 1];
             rank[j - 1] = swapped;
         }
-    return rank;
 }
 
 // The place of a multiset of ranks, given sorted ascending, among all
 // multisets of its size: adding i to the i-th rank makes the ranks strictly
 // ascending, and those have their place in the combinatorial number system.
 template <size_t N>
-constexpr int MultisetIndex(const std::array<int, N>& sorted)
+constexpr int MultisetIndex(const int (&sorted)[N])
 {
     int index = 0;
     for (size_t i = 0; i < N; ++i)
@@ -60,10 +61,8 @@ constexpr int MultisetIndex(const std::array<int, N>& sorted)
     return index;
 }
 
-constexpr int RankValue(int rank) { return rank < 9 ? rank + 1 : 10; }
-
 // Runs, pairs and fifteens of five ranks sorted ascending, rule by rule.
-constexpr int RankPoints(const std::array<int, 5>& rank)
+constexpr int RankPoints(const int (&rank)[5])
 {
     int points = 0;
 
@@ -100,7 +99,7 @@ constexpr int RankPoints(const std::array<int, 5>& rank)
     // Fifteens: every combination of two or more cards.
     int value[5] = {};
     for (int i = 0; i < 5; ++i)
-        value[i] = RankValue(rank[i]);
+        value[i] = Rank1Value(rank[i] + 1);
     for (int i = 0; i < 5; ++i)
         for (int j = i + 1; j < 5; ++j) {
             if (value[i] + value[j] == 15)
@@ -123,8 +122,11 @@ constexpr int RankPoints(const std::array<int, 5>& rank)
 constexpr auto kPairIndex = [] {
     std::array<std::array<uint8_t, 52>, 52> table{};
     for (CardId a = 0; a < 52; ++a)
-        for (CardId b = 0; b < 52; ++b)
-            table[a][b] = static_cast<uint8_t>(MultisetIndex(Sorted(std::array<int, 2>{CardRank(a), CardRank(b)})));
+        for (CardId b = 0; b < 52; ++b) {
+            int two[2] = {CardRank(a), CardRank(b)};
+            SortRanks(two);
+            table[a][b] = static_cast<uint8_t>(MultisetIndex(two));
+        }
     return table;
 }();
 
@@ -134,37 +136,37 @@ constexpr auto kFourIndex = [] {
     for (int a = 0; a < kRanks; ++a)
         for (int b = a; b < kRanks; ++b)
             for (int c = 0; c < kRanks; ++c)
-                for (int d = c; d < kRanks; ++d)
-                    table[MultisetIndex(std::array<int, 2>{a, b})][MultisetIndex(std::array<int, 2>{c, d})] =
-                        static_cast<uint16_t>(MultisetIndex(Sorted(std::array<int, 4>{a, b, c, d})));
+                for (int d = c; d < kRanks; ++d) {
+                    const int firstHalf[2] = {a, b};
+                    const int secondHalf[2] = {c, d};
+                    int four[4] = {a, b, c, d};
+                    SortRanks(four);
+                    table[MultisetIndex(firstHalf)][MultisetIndex(secondHalf)] = static_cast<uint16_t>(MultisetIndex(four));
+                }
     return table;
 }();
 
-// Fifteens, pairs and runs of every multiset of five ranks, by its place.
-constexpr auto kFivePoints = [] {
-    std::array<uint8_t, Multisets(5)> table{};
-    for (int a = 0; a < kRanks; ++a)
-        for (int b = a; b < kRanks; ++b)
-            for (int c = b; c < kRanks; ++c)
-                for (int d = c; d < kRanks; ++d)
-                    for (int e = d; e < kRanks; ++e) {
-                        const std::array<int, 5> rank = {a, b, c, d, e};
-                        table[MultisetIndex(rank)] = static_cast<uint8_t>(RankPoints(rank));
-                    }
-    return table;
-}();
-
-// The same points by the multiset of the four cards' ranks and the starter's rank.
+// Fifteens, pairs and runs, by the multiset of the four cards' ranks and the
+// starter's rank. Each multiset of five ranks, taken in ascending order, is
+// counted once; its starter may be any of its five ranks, and the other four,
+// still in order, name the row.
 constexpr auto kRankPoints = [] {
     std::array<std::array<uint8_t, kRanks>, Multisets(4)> table{};
     for (int a = 0; a < kRanks; ++a)
         for (int b = a; b < kRanks; ++b)
             for (int c = b; c < kRanks; ++c)
-                for (int d = c; d < kRanks; ++d) {
-                    auto& row = table[MultisetIndex(std::array<int, 4>{a, b, c, d})];
-                    for (int e = 0; e < kRanks; ++e)
-                        row[e] = kFivePoints[MultisetIndex(Sorted(std::array<int, 5>{a, b, c, d, e}))];
-                }
+                for (int d = c; d < kRanks; ++d)
+                    for (int e = d; e < kRanks; ++e) {
+                        const int five[5] = {a, b, c, d, e};
+                        const auto points = static_cast<uint8_t>(RankPoints(five));
+                        for (int starter = 0; starter < 5; ++starter) {
+                            int four[4] = {};
+                            for (int i = 0, j = 0; i < 5; ++i)
+                                if (i != starter)
+                                    four[j++] = five[i];
+                            table[MultisetIndex(four)][five[starter]] = points;
+                        }
+                    }
     return table;
 }();
 

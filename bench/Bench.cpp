@@ -1,0 +1,197 @@
+// Figures for the hand counter and the play scorer: every hand of four with a
+// starter counted under both rules (score table, totals, means, agreement with
+// the plain reference counter, time per count), then the time per play score
+// over a fixed set of random plays and the agreement of the play scorer with
+// its reference over every play the game can make. Times are printed, never
+// judged; the exit status is 1 only if a counter disagrees with its reference.
+// Needs no display. From the source folder:
+//   cmake -S . -B build/release -G Ninja -DCMAKE_BUILD_TYPE=Release
+//   cmake --build build/release --target vennick_bench
+//   build/release/bench/vennick_bench
+
+#include "play/PlaySequence.h"
+#include "scoring/HandCount.h"
+#include "tests/play/ReferencePlay.h"
+#include "tests/scoring/ReferenceCount.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdio>
+#include <random>
+#include <time.h>
+#include <vector>
+
+namespace {
+
+constexpr int kRepetitions = 7;
+constexpr int kMaxScore = 29;
+constexpr long long kHands = 12994800;
+constexpr int kPlays = 1000000;
+
+// Times are taken on this thread's own processor clock, so that other work on
+// a shared machine does not inflate them.
+double ThreadSeconds()
+{
+    timespec now{};
+    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
+    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
+}
+
+// Calls visit(cards) for all 12,994,800 hands: four cards in ascending order,
+// then every other card as starter.
+template <typename Visit>
+void ForEveryHand(Visit&& visit)
+{
+    CardId cards[5] = {};
+    for (cards[0] = 0; cards[0] < 52; ++cards[0])
+        for (cards[1] = cards[0] + 1; cards[1] < 52; ++cards[1])
+            for (cards[2] = cards[1] + 1; cards[2] < 52; ++cards[2])
+                for (cards[3] = cards[2] + 1; cards[3] < 52; ++cards[3])
+                    for (cards[4] = 0; cards[4] < 52; ++cards[4])
+                        if (cards[4] != cards[0] && cards[4] != cards[1] && cards[4] != cards[2]
+                            && cards[4] != cards[3])
+                            visit(cards);
+}
+
+double Median(std::vector<double> values)
+{
+    std::sort(values.begin(), values.end());
+    return values[values.size() / 2];
+}
+
+struct RuleFigures {
+    std::array<long long, kMaxScore + 2> hands{};  // the last slot: anything above 29
+    long long totalPoints = 0;
+    long long disagreements = 0;
+    double nanosecondsPerCount = 0;
+    long long checksum = 0;
+};
+
+RuleFigures CountEveryHand(bool cribRule)
+{
+    RuleFigures figures;
+    ForEveryHand([&](const CardId* cards) {
+        const int points = CountHandCards(cards, cribRule);
+        ++figures.hands[static_cast<size_t>(std::clamp(points, 0, kMaxScore + 1))];
+        figures.totalPoints += points;
+        if (points != ReferenceCountHand(cards, cribRule))
+            ++figures.disagreements;
+    });
+
+    std::vector<double> times;
+    for (int repetition = 0; repetition < kRepetitions; ++repetition) {
+        long long sum = 0;
+        const double start = ThreadSeconds();
+        ForEveryHand([&](const CardId* cards) { sum += CountHandCards(cards, cribRule); });
+        times.push_back((ThreadSeconds() - start) * 1e9 / static_cast<double>(kHands));
+        figures.checksum = sum;
+    }
+    figures.nanosecondsPerCount = Median(times);
+    return figures;
+}
+
+// Plays as the table makes them: cards from a shuffled deck laid in turn,
+// skipping any that would pass 31, until the drawn number of cards (1 to 8)
+// is down.
+std::vector<PlaySequence> RandomPlays()
+{
+    std::mt19937 random(20240611);
+    std::uniform_int_distribution<int> cardsWanted(1, 8);
+    std::array<int, 52> deck{};
+    for (int i = 0; i < 52; ++i)
+        deck[static_cast<size_t>(i)] = i % 13 + 1;
+    std::vector<PlaySequence> plays(kPlays);
+    for (PlaySequence& play : plays) {
+        std::shuffle(deck.begin(), deck.end(), random);
+        const int wanted = cardsWanted(random);
+        int total = 0;
+        int laid = 0;
+        for (int rank1 : deck) {
+            if (laid == wanted)
+                break;
+            if (total + Rank1Value(rank1) > 31)
+                continue;
+            SequenceAppend(play, rank1);
+            total += Rank1Value(rank1);
+            ++laid;
+        }
+    }
+    return plays;
+}
+
+// Every sequence the play can produce, scored by both scorers.
+long long PlayDisagreements(PlaySequence& sequence, int cards, int total, int copies[14], long long& visited)
+{
+    long long disagreements = 0;
+    if (cards > 0) {
+        ++visited;
+        disagreements += ScorePlay(sequence) != ReferenceScorePlay(sequence) ? 1 : 0;
+    }
+    if (cards == 8)
+        return disagreements;
+    for (int rank1 = 1; rank1 <= 13; ++rank1) {
+        if (copies[rank1] == 4 || total + Rank1Value(rank1) > 31)
+            continue;
+        ++copies[rank1];
+        sequence.entries[cards] = rank1;
+        sequence.entries[cards + 1] = -1;
+        disagreements += PlayDisagreements(sequence, cards + 1, total + Rank1Value(rank1), copies, visited);
+        sequence.entries[cards] = -1;
+        --copies[rank1];
+    }
+    return disagreements;
+}
+
+} // namespace
+
+int main()
+{
+#ifndef NDEBUG
+    std::printf("Warning: not an optimised build; the times below mean little.\n\n");
+#endif
+    std::printf("Hand counter: all %lld hands of four cards with a starter\n\n", kHands);
+    const RuleFigures hand = CountEveryHand(false);
+    const RuleFigures crib = CountEveryHand(true);
+
+    std::printf("%5s %12s %12s\n", "score", "hand rule", "crib rule");
+    for (int score = 0; score <= kMaxScore; ++score)
+        std::printf("%5d %12lld %12lld\n", score, hand.hands[static_cast<size_t>(score)],
+                    crib.hands[static_cast<size_t>(score)]);
+    std::printf("%5s %12lld %12lld\n", ">29", hand.hands[kMaxScore + 1], crib.hands[kMaxScore + 1]);
+    std::printf("%5s %12lld %12lld\n", "total", hand.totalPoints, crib.totalPoints);
+    std::printf("%5s %12.6f %12.6f\n", "mean", static_cast<double>(hand.totalPoints) / kHands,
+                static_cast<double>(crib.totalPoints) / kHands);
+    std::printf("\nDisagreements with the reference counter: hand rule %lld, crib rule %lld\n",
+                hand.disagreements, crib.disagreements);
+    std::printf("Time per count (median of %d passes over every hand): hand rule %.2f ns, crib rule %.2f ns\n",
+                kRepetitions, hand.nanosecondsPerCount, crib.nanosecondsPerCount);
+    std::printf("(checksums %lld %lld)\n", hand.checksum, crib.checksum);
+
+    std::printf("\nPlay scorer: %d random legal plays of 1 to 8 cards\n", kPlays);
+    const std::vector<PlaySequence> plays = RandomPlays();
+    long long randomDisagreements = 0;
+    for (const PlaySequence& play : plays)
+        randomDisagreements += ScorePlay(play) != ReferenceScorePlay(play) ? 1 : 0;
+    std::vector<double> times;
+    long long sum = 0;
+    for (int repetition = 0; repetition < kRepetitions; ++repetition) {
+        sum = 0;
+        const double start = ThreadSeconds();
+        for (const PlaySequence& play : plays)
+            sum += ScorePlay(play);
+        times.push_back((ThreadSeconds() - start) * 1e9 / kPlays);
+    }
+    std::printf("Time per ScorePlay call (median of %d passes): %.2f ns (points in all %lld)\n", kRepetitions,
+                Median(times), sum);
+
+    PlaySequence sequence;
+    int copies[14] = {};
+    long long visited = 0;
+    const long long everyDisagreements = PlayDisagreements(sequence, 0, 0, copies, visited);
+    std::printf("Disagreements with the reference scorer: %lld of the random plays, %lld of all %lld legal plays\n",
+                randomDisagreements, everyDisagreements, visited);
+
+    const bool agreed = hand.disagreements == 0 && crib.disagreements == 0 && randomDisagreements == 0
+        && everyDisagreements == 0;
+    return agreed ? 0 : 1;
+}
