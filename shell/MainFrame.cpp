@@ -71,12 +71,14 @@ void CMainFrame::OnAbout()
 {
     CAboutDlg dialog(this);
     dialog.exec();
+    activateWindow();
     board.setFocus();
 }
 
 void CMainFrame::OnOptionsCommand()
 {
     board.OnOptions();
+    activateWindow();
     board.setFocus();
 }
 

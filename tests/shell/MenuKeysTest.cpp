@@ -123,9 +123,6 @@ bool TableIsEmpty(const GameRecord& r)
 }
 
 // The program's own loop, run until something ends it; 7 after five seconds.
-// Running it also clears an exit that an earlier test asked for outside it,
-// which would otherwise make every later event loop, modal dialogs included,
-// return at once.
 int RunProgramLoop()
 {
     QTimer timeout;
@@ -142,12 +139,6 @@ class MenuKeysTest : public QObject {
     Q_OBJECT
 
 private slots:
-    void initTestCase()
-    {
-        QTimer::singleShot(0, [] { QCoreApplication::exit(0); });
-        QCOMPARE(RunProgramLoop(), 0);
-    }
-
     void menuItemsInOrder()
     {
         CMainFrame frame;
