@@ -15,7 +15,7 @@ bool Fits(int runningCount, int rank1)
 bool CannotPlay(const CardSprite hand[6], const CardId cards[6], int runningCount)
 {
     for (int p = 1; p <= 4; ++p)
-        if (hand[p].suit1 != kSuitEmpty && Fits(runningCount, CardRank(cards[p]) + 1))
+        if (hand[p].suit1 != kSuitEmpty && runningCount + CardValue(cards[p]) <= kMaxCount)
             return false;
     return true;
 }
