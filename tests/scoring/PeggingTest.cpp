@@ -46,7 +46,6 @@ private slots:
     void gameEndTally();
     void tallyStopsAtItsCeiling_data();
     void tallyStopsAtItsCeiling();
-    void gameEndsOnceAndFreezes();
 };
 
 void PeggingTest::announcement_data()
@@ -64,10 +63,8 @@ void PeggingTest::announcement_data()
     QTest::newRow("card scoring nothing") << int(kPhasePlay) << int(kSidePlayer) << 0 << "" << "" << false;
     QTest::newRow("computer's card scoring nothing") << int(kPhasePlay) << int(kSideOpponent) << 0 << "" << ""
                                                      << false;
-    QTest::newRow("user's hand") << int(kPhasePlayOver) << int(kSidePlayer) << 12 << " for your hand"
-                                 << "You peg 12 for your hand." << false;
-    QTest::newRow("computer's hand") << int(kPhaseHandCounted) << int(kSideOpponent) << 12 << " for his hand"
-                                     << "Opponent pegs 12 for his hand." << false;
+    QTest::newRow("user's hand, no pause") << int(kPhasePlayOver) << int(kSidePlayer) << 12 << " for your hand"
+                                           << "You peg 12 for your hand." << false;
     QTest::newRow("empty user's hand") << int(kPhasePlayOver) << int(kSidePlayer) << 0 << " for your hand"
                                        << "You peg 0 for your hand." << false;
     QTest::newRow("empty computer's hand") << int(kPhaseHandCounted) << int(kSideOpponent) << 0 << " for his hand"
@@ -222,31 +219,6 @@ void PeggingTest::tallyStopsAtItsCeiling()
 
     QCOMPARE(b.record.gamesFor, after);
     QCOMPARE(StoredValue("For"), after);
-}
-
-void PeggingTest::gameEndsOnceAndFreezes()
-{
-    auto board = MakeBoard();
-    GameBoard& b = *board;
-    GameRecord& r = b.record;
-    r.phase = kPhasePlayOver;
-    b.MoveOpponentPegs(119);
-    b.PegPoints(kSideOpponent, 2, QStringLiteral(" for his hand"));
-    QCOMPARE(r.gamesAgainst, 4);
-    const qsizetype mark = LogLines(b).size();
-
-    // A later count still announces itself, but the game is not won again and
-    // the board stays frozen.
-    r.phase = kPhaseHandCounted;
-    b.PegPoints(kSidePlayer, 5, QStringLiteral(" for your hand"));
-    b.PegPoints(kSideOpponent, 3, QStringLiteral(" for the crib"));
-    QCOMPARE(LogLines(b).mid(mark),
-             (QStringList{"You peg 5 for your hand.", "Opponent pegs 3 for the crib."}));
-    QCOMPARE(b.PlayerScore(), 0);
-    QCOMPARE(b.OpponentScore(), 121);
-    QCOMPARE(r.gamesAgainst, 4);
-    QCOMPARE(r.gamesFor, 0);
-    QCOMPARE(r.phase, int32_t(kPhaseGameOver));
 }
 
 VENNICK_TEST(PeggingTest);
