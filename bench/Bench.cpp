@@ -2,13 +2,15 @@
 // starter counted under both rules (score table, totals, means, agreement with
 // the plain reference counter, time per count), then the time per play score
 // over a fixed set of random plays and the agreement of the play scorer with
-// its reference over every play the game can make. Times are printed, never
+// its reference over every play the game can make; then the computer's
+// decisions and whole games (bench/GameBench.cpp). Times are printed, never
 // judged; the exit status is 1 only if a counter disagrees with its reference.
 // Needs no display. From the source folder:
 //   cmake -S . -B build/release -G Ninja -DCMAKE_BUILD_TYPE=Release
 //   cmake --build build/release --target vennick_bench
 //   build/release/bench/vennick_bench
 
+#include "bench/GameBench.h"
 #include "play/PlaySequence.h"
 #include "scoring/HandCount.h"
 #include "tests/play/ReferencePlay.h"
@@ -144,7 +146,7 @@ long long PlayDisagreements(PlaySequence& sequence, int cards, int total, int co
 
 } // namespace
 
-int main()
+int main(int argc, char** argv)
 {
 #ifndef NDEBUG
     std::printf("Warning: not an optimised build; the times below mean little.\n\n");
@@ -190,6 +192,8 @@ int main()
     const long long everyDisagreements = PlayDisagreements(sequence, 0, 0, copies, visited);
     std::printf("Disagreements with the reference scorer: %lld of the random plays, %lld of all %lld legal plays\n",
                 randomDisagreements, everyDisagreements, visited);
+
+    RunGameBench(argc, argv);
 
     const bool agreed = hand.disagreements == 0 && crib.disagreements == 0 && randomDisagreements == 0
         && everyDisagreements == 0;

@@ -126,6 +126,8 @@ void GameBoard::CreateActionButtons()
     messageLog->setObjectName(QStringLiteral("MessageLog"));
     messageLog->setFocusPolicy(Qt::NoFocus);
     messageLog->setSelectionMode(QAbstractItemView::NoSelection);
+    // Every line is one line of text: the list need not measure them one by one.
+    messageLog->setUniformItemSizes(true);
     messageLog->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
     QFont logFont = this->font();
     logFont.setPixelSize(std::max(9, 10 * record.scaleY));
