@@ -132,6 +132,9 @@ public:
     void SaveSettings();
     void OnOptions();
     void ApplyBoardStyle(int style);
+    // True while the store lacks values of this run that a save could not
+    // write: loading then keeps them rather than going back to older ones.
+    bool storeBehind = false;
 
 protected:
     void paintEvent(QPaintEvent* event) override;

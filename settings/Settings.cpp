@@ -118,25 +118,38 @@ QString SystemOwnerName()
 void GameBoard::LoadSettings()
 {
     GameRecord& r = record;
-    r.ownerName = kDefaultOwnerName;
-    r.gamesFor = 0;
-    r.gamesAgainst = 0;
-    r.boardStyle = 1;
+    if (!storeBehind) {
+        r.ownerName = kDefaultOwnerName;
+        r.gamesFor = 0;
+        r.gamesAgainst = 0;
+        r.boardStyle = 1;
+    }
 
     std::optional<QSettings> settings;
     StoreState state = OpenStore(settings);
-    if (state == StoreState::Missing)
-        state = WriteStore(*settings, r) ? StoreState::Present : StoreState::Unusable;
+    // A new store starts from the values in hand; one that missed a save is
+    // brought up to date before it is read back, and where it still cannot be
+    // written, the values in hand stay.
+    if (state == StoreState::Missing || (state == StoreState::Present && storeBehind)) {
+        if (WriteStore(*settings, r)) {
+            storeBehind = false;
+            state = StoreState::Present;
+        } else if (state == StoreState::Missing) {
+            state = StoreState::Unusable;
+        }
+    }
 
     if (state == StoreState::Present) {
-        ReadInt32(*settings, QStringLiteral("For"), r.gamesFor);
-        ReadInt32(*settings, QStringLiteral("Against"), r.gamesAgainst);
-        int32_t crib = 0;
-        // The crib alternates by inverting 0 and 1; a damaged value would stop
-        // it, so anything but 0 means the user's.
-        if (ReadInt32(*settings, QStringLiteral("Crib"), crib))
-            r.savedPlayerCrib = crib != 0 ? 1 : 0;
-        ReadInt32(*settings, QStringLiteral("Board"), r.boardStyle);
+        if (!storeBehind) {
+            ReadInt32(*settings, QStringLiteral("For"), r.gamesFor);
+            ReadInt32(*settings, QStringLiteral("Against"), r.gamesAgainst);
+            int32_t crib = 0;
+            // The crib alternates by inverting 0 and 1; a damaged value would
+            // stop it, so anything but 0 means the user's.
+            if (ReadInt32(*settings, QStringLiteral("Crib"), crib))
+                r.savedPlayerCrib = crib != 0 ? 1 : 0;
+            ReadInt32(*settings, QStringLiteral("Board"), r.boardStyle);
+        }
         r.ownerName = SystemOwnerName();
     }
     // Also without a store, so the first crib still alternates from game to game.
@@ -150,7 +163,7 @@ void GameBoard::LoadSettings()
 void GameBoard::SaveSettings()
 {
     std::optional<QSettings> settings;
-    // A store that is missing is created by the next load, not here.
-    if (OpenStore(settings) == StoreState::Present)
-        WriteStore(*settings, record);
+    // A store that is missing is created by the next load, not here; until
+    // then, as when it cannot be written, it is behind this run.
+    storeBehind = !(OpenStore(settings) == StoreState::Present && WriteStore(*settings, record));
 }

@@ -303,6 +303,12 @@ private slots:
             board->SaveSettings();
             QCOMPARE(board->record.gamesFor, expectFor + 1);
             QVERIFY(!QApplication::activeModalWidget());
+
+            // New game keeps this run's tally, whether or not the store took it.
+            board->NewGame();
+            QCOMPARE(LogLines(*board), TallyLines(owner, expectFor + 1, expectAgainst));
+            board->record.savedPlayerCrib = 1;  // as before New, for the file's check below
+            board->SaveSettings();
         }
         if (kind == ReadOnlyFolder)
             QFile::setPermissions(store.Folder(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
