@@ -39,22 +39,6 @@ double ThreadSeconds()
     return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
 }
 
-// Calls visit(cards) for all 12,994,800 hands: four cards in ascending order,
-// then every other card as starter.
-template <typename Visit>
-void ForEveryHand(Visit&& visit)
-{
-    CardId cards[5] = {};
-    for (cards[0] = 0; cards[0] < 52; ++cards[0])
-        for (cards[1] = cards[0] + 1; cards[1] < 52; ++cards[1])
-            for (cards[2] = cards[1] + 1; cards[2] < 52; ++cards[2])
-                for (cards[3] = cards[2] + 1; cards[3] < 52; ++cards[3])
-                    for (cards[4] = 0; cards[4] < 52; ++cards[4])
-                        if (cards[4] != cards[0] && cards[4] != cards[1] && cards[4] != cards[2]
-                            && cards[4] != cards[3])
-                            visit(cards);
-}
-
 double Median(std::vector<double> values)
 {
     std::sort(values.begin(), values.end());
@@ -121,29 +105,6 @@ std::vector<PlaySequence> RandomPlays()
     return plays;
 }
 
-// Every sequence the play can produce, scored by both scorers.
-long long PlayDisagreements(PlaySequence& sequence, int cards, int total, int copies[14], long long& visited)
-{
-    long long disagreements = 0;
-    if (cards > 0) {
-        ++visited;
-        disagreements += ScorePlay(sequence) != ReferenceScorePlay(sequence) ? 1 : 0;
-    }
-    if (cards == 8)
-        return disagreements;
-    for (int rank1 = 1; rank1 <= 13; ++rank1) {
-        if (copies[rank1] == 4 || total + Rank1Value(rank1) > 31)
-            continue;
-        ++copies[rank1];
-        sequence.entries[cards] = rank1;
-        sequence.entries[cards + 1] = -1;
-        disagreements += PlayDisagreements(sequence, cards + 1, total + Rank1Value(rank1), copies, visited);
-        sequence.entries[cards] = -1;
-        --copies[rank1];
-    }
-    return disagreements;
-}
-
 } // namespace
 
 int main(int argc, char** argv)
@@ -186,10 +147,12 @@ int main(int argc, char** argv)
     std::printf("Time per ScorePlay call (median of %d passes): %.2f ns (points in all %lld)\n", kRepetitions,
                 Median(times), sum);
 
-    PlaySequence sequence;
-    int copies[14] = {};
     long long visited = 0;
-    const long long everyDisagreements = PlayDisagreements(sequence, 0, 0, copies, visited);
+    long long everyDisagreements = 0;
+    ForEveryLegalPlay(8, [&](const PlaySequence& sequence) {
+        ++visited;
+        everyDisagreements += ScorePlay(sequence) != ReferenceScorePlay(sequence) ? 1 : 0;
+    });
     std::printf("Disagreements with the reference scorer: %lld of the random plays, %lld of all %lld legal plays\n",
                 randomDisagreements, everyDisagreements, visited);
 

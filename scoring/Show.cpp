@@ -7,34 +7,34 @@ bool GameWon(const GameBoard& board)
     return board.PlayerScore() == kGameHole || board.OpponentScore() == kGameHole;
 }
 
+// One side's hand of four with the starter, counted and pegged. The
+// non-dealer's hand is counted first, the dealer's second; phase 9 is how a
+// hand count knows it is the second one and the crib comes next.
+void ScoreHand(GameBoard& board, int side, int firstSlot, const QString& suffix, void (GameBoard::*showOtherHand)())
+{
+    GameRecord& r = board.record;
+    const CardId* hand = r.deal + firstSlot;
+    const CardId cards[5] = {hand[0], hand[1], hand[2], hand[3], r.deal[12]};
+    board.PegPoints(side, board.CountHand(cards), suffix);
+    if (!GameWon(board)) {
+        if (r.phase == kPhaseHandCounted)
+            board.ShowScoreCrib();
+        else
+            (board.*showOtherHand)();
+    }
+    r.phase = kPhaseHandCounted;
+}
+
 } // namespace
 
-// The non-dealer's hand is counted first, the dealer's second; phase 9 is how
-// a hand count knows it is the second one and the crib comes next.
 void GameBoard::ScorePlayerHand()
 {
-    const CardId cards[5] = {record.deal[1], record.deal[2], record.deal[3], record.deal[4], record.deal[12]};
-    PegPoints(kSidePlayer, CountHand(cards), QStringLiteral(" for your hand"));
-    if (!GameWon(*this)) {
-        if (record.phase == kPhaseHandCounted)
-            ShowScoreCrib();
-        else
-            ShowScoreOpponentHand();
-    }
-    record.phase = kPhaseHandCounted;
+    ScoreHand(*this, kSidePlayer, 1, QStringLiteral(" for your hand"), &GameBoard::ShowScoreOpponentHand);
 }
 
 void GameBoard::ScoreOpponentHand()
 {
-    const CardId cards[5] = {record.deal[7], record.deal[8], record.deal[9], record.deal[10], record.deal[12]};
-    PegPoints(kSideOpponent, CountHand(cards), QStringLiteral(" for his hand"));
-    if (!GameWon(*this)) {
-        if (record.phase == kPhaseHandCounted)
-            ShowScoreCrib();
-        else
-            ShowScorePlayerHand();
-    }
-    record.phase = kPhaseHandCounted;
+    ScoreHand(*this, kSideOpponent, 7, QStringLiteral(" for his hand"), &GameBoard::ShowScorePlayerHand);
 }
 
 void GameBoard::ScoreCrib()

@@ -31,35 +31,20 @@ bool SameEntries(const PlaySequence& a, const PlaySequence& b)
     return std::memcmp(a.entries, b.entries, sizeof a.entries) == 0;
 }
 
-// Visits every sequence the play can produce (at most four of a rank, the
-// count never past 31) up to maxCards long, each scored by both scorers.
-// Returns the number of sequences whose scores differ, and the first of them.
+// Scores every sequence the play can produce up to maxCards long with both
+// scorers: how many there were, how many differ, and the first that does.
 struct Walk {
-    int maxCards = 0;
     long long visited = 0;
     long long mismatches = 0;
     PlaySequence firstMismatch;
-    int copies[14] = {};
 
-    void From(PlaySequence& sequence, int cards, int total)
+    explicit Walk(int maxCards)
     {
-        if (cards > 0) {
+        ForEveryLegalPlay(maxCards, [this](const PlaySequence& sequence) {
             ++visited;
             if (ScorePlay(sequence) != ReferenceScorePlay(sequence) && mismatches++ == 0)
                 firstMismatch = sequence;
-        }
-        if (cards == maxCards)
-            return;
-        for (int rank1 = 1; rank1 <= 13; ++rank1) {
-            if (copies[rank1] == 4 || total + Rank1Value(rank1) > 31)
-                continue;
-            ++copies[rank1];
-            sequence.entries[cards] = rank1;
-            sequence.entries[cards + 1] = -1;
-            From(sequence, cards + 1, total + Rank1Value(rank1));
-            sequence.entries[cards] = -1;
-            --copies[rank1];
-        }
+        });
     }
 };
 
@@ -186,10 +171,7 @@ void ScorePlayTest::scoresLastCard()
 
 void ScorePlayTest::shortPlaysAgreeWithReference()
 {
-    Walk walk;
-    walk.maxCards = 4;
-    PlaySequence sequence;
-    walk.From(sequence, 0, 0);
+    const Walk walk(4);
     QVERIFY2(walk.mismatches == 0, qPrintable(Describe(walk.firstMismatch)));
     QVERIFY(walk.visited > 20000);
 }
@@ -235,10 +217,7 @@ void ScorePlayTest::everyPlayAgreesWithReference()
 {
     if (qEnvironmentVariableIntValue("VENNICK_EXHAUSTIVE") == 0)
         QSKIP("set VENNICK_EXHAUSTIVE=1 to score every play");
-    Walk walk;
-    walk.maxCards = 8;
-    PlaySequence sequence;
-    walk.From(sequence, 0, 0);
+    const Walk walk(8);
     QVERIFY2(walk.mismatches == 0, qPrintable(Describe(walk.firstMismatch)));
     QCOMPARE(walk.visited, 12892167LL);
 }

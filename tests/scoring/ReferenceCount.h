@@ -54,3 +54,19 @@ inline int ReferenceCountHand(const CardId cards[5], bool cribRule)
 
     return points;
 }
+
+// Calls visit(cards) for all 12,994,800 hands: four cards in ascending order,
+// then every other card as starter.
+template <typename Visit>
+void ForEveryHand(Visit visit)
+{
+    CardId cards[5] = {};
+    for (cards[0] = 0; cards[0] < 52; ++cards[0])
+        for (cards[1] = cards[0] + 1; cards[1] < 52; ++cards[1])
+            for (cards[2] = cards[1] + 1; cards[2] < 52; ++cards[2])
+                for (cards[3] = cards[2] + 1; cards[3] < 52; ++cards[3])
+                    for (cards[4] = 0; cards[4] < 52; ++cards[4])
+                        if (cards[4] != cards[0] && cards[4] != cards[1] && cards[4] != cards[2]
+                            && cards[4] != cards[3])
+                            visit(static_cast<const CardId*>(cards));
+}
