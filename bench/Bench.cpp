@@ -11,6 +11,7 @@
 //   build/release/bench/vennick_bench
 
 #include "bench/GameBench.h"
+#include "bench/Timing.h"
 #include "play/PlaySequence.h"
 #include "scoring/HandCount.h"
 #include "tests/play/ReferencePlay.h"
@@ -20,7 +21,6 @@
 #include <array>
 #include <cstdio>
 #include <random>
-#include <time.h>
 #include <vector>
 
 namespace {
@@ -29,21 +29,6 @@ constexpr int kRepetitions = 7;
 constexpr int kMaxScore = 29;
 constexpr long long kHands = 12994800;
 constexpr int kPlays = 1000000;
-
-// Times are taken on this thread's own processor clock, so that other work on
-// a shared machine does not inflate them.
-double ThreadSeconds()
-{
-    timespec now{};
-    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
-    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
-}
-
-double Median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
-}
 
 struct RuleFigures {
     std::array<long long, kMaxScore + 2> hands{};  // the last slot: anything above 29

@@ -1,4 +1,5 @@
 #include "bench/GameBench.h"
+#include "bench/Timing.h"
 
 #include "game/GameBoard.h"
 #include "play/PlaySequence.h"
@@ -12,26 +13,12 @@
 #include <cstdio>
 #include <numeric>
 #include <random>
-#include <time.h>
 #include <vector>
 
 namespace {
 
 constexpr int kBatches = 201;
 constexpr uint32_t kSeed = 20261206u;
-
-double ThreadSeconds()
-{
-    timespec now{};
-    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
-    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
-}
-
-double Median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
-}
 
 std::vector<CardId> ShuffledDeck(std::mt19937& random)
 {
