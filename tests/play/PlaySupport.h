@@ -1,7 +1,7 @@
 #pragma once
 
-// Deals laid out card by card for the play and the show, and the user's moves
-// made through real taps and keys.
+// Deals laid out card by card for the play and the show, and scripts of the
+// user's moves made through real taps, keys and clicks.
 
 #include "support/TestBoard.h"
 
@@ -12,36 +12,32 @@
 // One deal as it stands after both sides have discarded.
 struct TableCards {
     std::array<CardId, 4> player;        // the user's kept hand, in rank order
-    std::array<CardId, 2> playerCrib;    // the user's two discards
+    std::array<CardId, 2> playerCrib;
     std::array<CardId, 4> computer;      // the computer's kept hand, in its own order
-    std::array<CardId, 2> computerCrib;  // the computer's two discards
+    std::array<CardId, 2> computerCrib;
     CardId starter;
 };
+Q_DECLARE_METATYPE(TableCards)
 
-// Deals, replaces the cards dealt with these (the computer's own discard choice
-// is overruled so the hands are known), then makes the user's discard with two
-// taps and "Send To Crib", which turns the starter and starts the play.
-// userDeals decides whose crib it is.
+// Deals, replaces the cards dealt with these (overruling the computer's own
+// discard so the hands are known), then discards with two taps and "Send To
+// Crib", which turns the starter and starts the play.
 inline void StartDeal(GameBoard& board, bool userDeals, const TableCards& cards)
 {
     GameRecord& r = board.record;
     r.playerCrib = userDeals ? 0 : 1;  // every deal passes the crib over
     ClickButton(board, kCmdDeal);
     QCOMPARE(r.phase, int32_t(kPhaseDiscard));
-
-    r.deal[0] = cards.playerCrib[0];
-    r.deal[5] = cards.playerCrib[1];
-    r.deal[6] = cards.computerCrib[0];
-    r.deal[11] = cards.computerCrib[1];
-    for (int i = 0; i < 4; ++i) {
-        r.deal[1 + i] = cards.player[i];
-        r.deal[7 + i] = cards.computer[i];
-    }
-    r.deal[12] = cards.starter;
+    const CardId deal[13] = {cards.playerCrib[0], cards.player[0], cards.player[1], cards.player[2],
+                             cards.player[3], cards.playerCrib[1], cards.computerCrib[0], cards.computer[0],
+                             cards.computer[1], cards.computer[2], cards.computer[3], cards.computerCrib[1],
+                             cards.starter};
+    for (int i = 0; i < 13; ++i)
+        r.deal[i] = deal[i];
     for (int i = 0; i < 6; ++i)
-        r.playerHandSprites[i].suit1 = CardSuit(r.deal[i]) + 1;
+        r.playerHandSprites[i].suit1 = CardSuit(deal[i]) + 1;
     for (int i = 1; i <= 4; ++i)
-        r.opponentHandSprites[i].suit1 = CardSuit(r.deal[6 + i]) + 1;
+        r.opponentHandSprites[i].suit1 = CardSuit(deal[6 + i]) + 1;
     board.SyncCardSprites();
 
     TapHand(board, 1);
@@ -50,19 +46,13 @@ inline void StartDeal(GameBoard& board, bool userDeals, const TableCards& cards)
     QCOMPARE(r.phase, int32_t(kPhasePlay));
 }
 
-// The input position (1..6) of a card in the user's hand, or 0 once laid.
-inline int HandPosition(const GameBoard& board, CardId card)
-{
-    for (int p = 1; p <= 4; ++p)
-        if (board.record.deal[p] == card && board.record.playerHandSprites[p].suit1 != kSuitEmpty)
-            return p + 1;
-    return 0;
-}
-
 // Lays a card of the user's hand with a tap on it, or with its digit key.
 inline void LayCard(GameBoard& board, CardId card, bool byKey = false)
 {
-    const int position = HandPosition(board, card);
+    int position = 0;
+    for (int p = 1; p <= 4; ++p)
+        if (board.record.deal[p] == card && board.record.playerHandSprites[p].suit1 != kSuitEmpty)
+            position = p + 1;
     QVERIFY2(position != 0, "the card is not in the hand");
     if (byKey)
         PressKey(board, Qt::Key_1 + position - 1);
@@ -70,56 +60,82 @@ inline void LayCard(GameBoard& board, CardId card, bool byKey = false)
         TapHand(board, position);
 }
 
-// Scores made before this deal: pegged the way the board pegs any points.
-inline void SetScores(GameBoard& board, int player, int opponent)
-{
-    board.MovePlayerPegs(player);
-    board.MoveOpponentPegs(opponent);
-}
+// What a step of a script does besides laying a card (CardIds are 0..51).
+enum StepAction : int {
+    kLook = -1,           // nothing: the table as the deal left it
+    kPress = -2,          // the one button shown: a click, or Enter by keyboard
+    kTapEverything = -3,  // every hand position by tap and key, then Enter
+};
 
-// Lines the log received since it held `from` lines.
-inline QStringList LinesSince(const GameBoard& board, qsizetype from)
-{
-    return LogLines(board).mid(from);
-}
+// One move of the user and the table after it.
+struct Step {
+    int action;          // a card to lay, or a StepAction
+    QStringList said;    // the lines the log received
+    int count;           // the running count
+    int you;
+    int opponent;
+    QList<int> buttons;  // the action buttons shown
+    int shown = 0;       // the number on display, when it differs from a count just reset
+};
+Q_DECLARE_METATYPE(QList<Step>)
 
-// The rank1 values of the cards laid since the count was last reset.
-inline QList<int> SequenceRanks(const GameBoard& board)
+// Plays the steps and compares the table after each; the log is read from
+// the line numbered `mark` on.
+inline void RunSteps(GameBoard& board, const QList<Step>& steps, bool byKey, qsizetype mark)
 {
-    QList<int> ranks;
-    for (int entry : board.record.playSequence.entries) {
-        if (entry == -1)
-            break;
-        ranks.append(entry);
+    const GameRecord& r = board.record;
+    const auto describe = [](qsizetype n, const QStringList& said, int count, int you, int opponent,
+                             const QList<int>& buttons) {
+        QStringList ids;
+        for (int id : buttons)
+            ids.append(QString::number(id));
+        return QStringLiteral("step %1: [%2] count %3, %4 to %5, buttons [%6]")
+            .arg(n).arg(said.join(QStringLiteral(" / "))).arg(count).arg(you).arg(opponent).arg(ids.join(' '));
+    };
+    for (qsizetype n = 1; n <= steps.size(); ++n) {
+        const Step& step = steps[n - 1];
+        if (step.action == kPress) {
+            const QList<int> shown = ShownButtons(board);
+            QCOMPARE(shown.size(), 1);
+            byKey ? ReleaseEnter(board) : ClickButton(board, shown.first());
+        } else if (step.action == kTapEverything) {
+            for (int position = 1; position <= 6; ++position) {
+                TapHand(board, position);
+                PressKey(board, Qt::Key_1 + position - 1);
+            }
+            ReleaseEnter(board);
+        } else if (step.action != kLook) {
+            LayCard(board, step.action, byKey);
+        }
+        const QStringList lines = LogLines(board);
+        QCOMPARE(describe(n, lines.mid(mark), r.runningCount, board.PlayerScore(), board.OpponentScore(),
+                          ShownButtons(board)),
+                 describe(n, step.said, step.count, step.you, step.opponent, step.buttons));
+        if (const int shown = step.shown ? step.shown : step.count)
+            QCOMPARE(r.shownCount, shown);
+        mark = lines.size();
     }
-    return ranks;
 }
 
-// Deals used by more than one suite. The computer deals in the first, the user
-// in the second; each is played out by laying the user's four cards in order.
+// Deals used by more than one suite, played out by laying the user's four
+// cards in order. The computer deals in the first, the user in the second.
 namespace Deals {
 
-// Computer's crib. The user leads 2, the computer answers K; after the user's 8
-// the computer lays 6 and 5 in a row for 31 (2) and the user leads again; the
-// user's Q at 30 ends the play with the user's go.
+// The user leads 2, the computer answers K; after the user's 8 the computer
+// lays 6 and 5 in a row for 31 (2) and the user leads again; the user's Q at
+// 30 ends the play with the user's go.
 inline TableCards ComputerRunsToThirtyOne()
 {
-    return {{Card(2, 1), Card(8, 2), Card(10, 3), Card(12, 4)},
-            {Card(1, 2), Card(4, 2)},
-            {Card(13, 1), Card(13, 2), Card(6, 3), Card(5, 1)},
-            {Card(9, 2), Card(13, 4)},
-            Card(5, 3)};
+    return {{Card(2, 1), Card(8, 2), Card(10, 3), Card(12, 4)}, {Card(1, 2), Card(4, 2)},
+            {Card(13, 1), Card(13, 2), Card(6, 3), Card(5, 1)}, {Card(9, 2), Card(13, 4)}, Card(5, 3)};
 }
 
-// User's crib. The computer leads a four; the user's Q, last card of the eight,
-// makes 30 and pegs the go. The crib is four hearts with a club starter.
+// The computer leads a four; the user's Q, last card of the eight, makes 30
+// and pegs the go. The crib is four hearts with a club starter.
 inline TableCards UserLastCardGo()
 {
-    return {{Card(1, 1), Card(1, 3), Card(6, 2), Card(12, 3)},
-            {Card(1, 2), Card(3, 2)},
-            {Card(4, 1), Card(2, 1), Card(2, 4), Card(4, 3)},
-            {Card(7, 2), Card(12, 2)},
-            Card(9, 4)};
+    return {{Card(1, 1), Card(1, 3), Card(6, 2), Card(12, 3)}, {Card(1, 2), Card(3, 2)},
+            {Card(4, 1), Card(2, 1), Card(2, 4), Card(4, 3)}, {Card(7, 2), Card(12, 2)}, Card(9, 4)};
 }
 
 } // namespace Deals
