@@ -107,6 +107,7 @@ private slots:
         auto board = MakeBoard(1, true);
 
         QCOMPARE(board->record.boardStyle, style);
+        QCOMPARE(board->record.savedPlayerCrib, crib);  // read as 0 or 1 only
         QCOMPARE(LogLines(*board), TallyLines(SystemOwnerName(), gamesFor, gamesAgainst));
         QVERIFY(ShowsBoard(*board, StyleBitmap(style)));
         if (style != 1)
