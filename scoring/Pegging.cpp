@@ -66,20 +66,19 @@ void GameBoard::PegPoints(int side, int points, const QString& suffix)
         }
     }
 
-    if (PlayerScore() == kGameHole && record.gameOver == 0) {
+    // The first side home ends the game once: the verdict, and the winner's
+    // tally grown by what the loser's score earns it, saved at once.
+    auto endGame = [this](const QString& verdict, int32_t& tally, int loserScore) {
         record.gameOver = 1;
-        LogMessage(QStringLiteral("You won."));
+        LogMessage(verdict);
         LogMessage(QStringLiteral("Please click New to play again."));
-        record.gamesFor = AddGames(record.gamesFor, GamesForWin(OpponentScore()));
+        tally = AddGames(tally, GamesForWin(loserScore));
         SaveSettings();
-    }
-    if (OpponentScore() == kGameHole && record.gameOver == 0) {
-        record.gameOver = 1;
-        LogMessage(QStringLiteral("You lost."));
-        LogMessage(QStringLiteral("Please click New to play again."));
-        record.gamesAgainst = AddGames(record.gamesAgainst, GamesForWin(PlayerScore()));
-        SaveSettings();
-    }
+    };
+    if (PlayerScore() == kGameHole && record.gameOver == 0)
+        endGame(QStringLiteral("You won."), record.gamesFor, OpponentScore());
+    if (OpponentScore() == kGameHole && record.gameOver == 0)
+        endGame(QStringLiteral("You lost."), record.gamesAgainst, PlayerScore());
     if (PlayerScore() == kGameHole || OpponentScore() == kGameHole) {
         // Only New starts another game; "Deal" keeps whatever state it had.
         for (int id : {kCmdSendToCrib, kCmdScorePlayerHand, kCmdScoreOpponentHand, kCmdScoreCrib, kCmdOk})
