@@ -1,6 +1,7 @@
 #include "support/TestMain.h"
 
-#include <QApplication>
+#include "shell/GameApp.h"
+
 #include <QSettings>
 #include <QStandardPaths>
 #include <QTemporaryDir>
@@ -36,7 +37,8 @@ int main(int argc, char** argv)
     // Real widgets and input without a display, also when run by hand.
     if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
-    QApplication app(argc, argv);
+    // The program's own application object, so its start-up can be tested too.
+    CGameApp app(argc, argv);
     int failed = 0;
     for (auto& [name, run] : Registry()) {
         if (run(argc, argv) != 0) {
