@@ -108,7 +108,14 @@ public:
     // --- presentation/
     void BuildHoleMap();
     void ResetTable();
+    // A board rectangle in window coordinates, covering its device pixels.
     QRect ScaledRect(const Rect& r) const;
+    // A window point in device pixels, which the factors divide.
+    QPoint DevicePoint(QPointF point) const;
+    // The message log's board rectangle.
+    Rect LogRect() const;
+    // The game window's size in device pixels for a scale factor.
+    QSize DeviceWindowSize(int scale) const;
     void Invalidate(const Rect& r);
     void LoadImages();
     void ReloadBoardBitmap();

@@ -20,7 +20,7 @@ void GameBoard::OnCommand(int id)
 void GameBoard::mousePressEvent(QMouseEvent* event)
 {
     if (event->button() == Qt::LeftButton)
-        OnLButtonDown(event->position().toPoint());
+        OnLButtonDown(DevicePoint(event->position()));
     QWidget::mousePressEvent(event);
 }
 

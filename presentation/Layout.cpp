@@ -4,6 +4,7 @@
 #include <QFont>
 #include <QListWidget>
 #include <QPushButton>
+#include <QtMath>
 
 #include <algorithm>
 
@@ -73,11 +74,35 @@ int GameBoard::ScaleFactorY(int height)
     return std::max(1, (height + kHeightAllowance) / kLogicalHeight);
 }
 
+QSize GameBoard::DeviceWindowSize(int scale) const
+{
+    // Tall enough for the whole log, which at scale 1 ends a pixel below 268.
+    return QSize(kLogicalWidth * scale,
+                 std::max(kLogicalHeight * scale - kHeightAllowance, LogRect().bottom * scale));
+}
+
+Rect GameBoard::LogRect() const
+{
+    const int bh = boardInfo.bmHeight;
+    return Rect{3, bh + 2, record.opponentHandSprites[5].rect.right, bh + 58};
+}
+
 QRect GameBoard::ScaledRect(const Rect& r) const
 {
+    // The factors count device pixels; a window pixel is `ratio` of them, so
+    // fractional edges round outwards and the rectangle covers every device pixel.
+    const qreal ratio = devicePixelRatioF();
     const int sx = record.scaleX;
     const int sy = record.scaleY;
-    return QRect(r.left * sx, r.top * sy, (r.right - r.left) * sx, (r.bottom - r.top) * sy);
+    const QPoint topLeft(qFloor(r.left * sx / ratio), qFloor(r.top * sy / ratio));
+    const QPoint end(qCeil(r.right * sx / ratio), qCeil(r.bottom * sy / ratio));
+    return QRect(topLeft, QSize(end.x() - topLeft.x(), end.y() - topLeft.y()));
+}
+
+QPoint GameBoard::DevicePoint(QPointF point) const
+{
+    const qreal ratio = devicePixelRatioF();
+    return QPoint(qFloor(point.x() * ratio), qFloor(point.y() * ratio));
 }
 
 void GameBoard::Invalidate(const Rect& r)
@@ -93,8 +118,9 @@ void GameBoard::CreateActionButtons()
     const int bh = boardInfo.bmHeight;
     // The centre of the card area: the right edge of the third card of the top row.
     const int cx = record.opponentHandSprites[2].rect.right + 1;
+    // Ten board pixels of text, counted in device pixels like the images.
     QFont font = this->font();
-    font.setPixelSize(std::max(9, 10 * record.scaleY));
+    font.setPixelSize(std::max(9, qRound(10 * record.scaleY / devicePixelRatioF())));
 
     struct ButtonPlace {
         QPushButton** button;
@@ -129,9 +155,7 @@ void GameBoard::CreateActionButtons()
     // Every line is one line of text: the list need not measure them one by one.
     messageLog->setUniformItemSizes(true);
     messageLog->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
-    QFont logFont = this->font();
-    logFont.setPixelSize(std::max(9, 10 * record.scaleY));
-    messageLog->setFont(logFont);
-    messageLog->setGeometry(ScaledRect(Rect{3, bh + 2, record.opponentHandSprites[5].rect.right, bh + 58}));
+    messageLog->setFont(font);
+    messageLog->setGeometry(ScaledRect(LogRect()));
     messageLog->show();
 }

@@ -12,8 +12,11 @@ const QColor kTableGreen(0, 128, 0);
 void GameBoard::FirstPaintSetup()
 {
     record.firstPaintPending = 0;
-    record.scaleX = ScaleFactorX(width());
-    record.scaleY = ScaleFactorY(height());
+    // Whole factors of device pixels, so a fractional ratio still enlarges
+    // every art pixel to a whole block of screen pixels.
+    const qreal ratio = devicePixelRatioF();
+    record.scaleX = ScaleFactorX(qRound(width() * ratio));
+    record.scaleY = ScaleFactorY(qRound(height() * ratio));
     CreateActionButtons();
     LoadSettings();
     ReloadBoardBitmap();
@@ -61,6 +64,10 @@ void GameBoard::paintEvent(QPaintEvent* event)
     QPainter painter(this);
     painter.setClipRegion(event->region());
     painter.fillRect(rect(), kTableGreen);
+    // From here on coordinates are device pixels: every image is copied at
+    // exactly the whole factors, without resampling by the ratio.
+    const qreal ratio = devicePixelRatioF();
+    painter.scale(1 / ratio, 1 / ratio);
 
     PaintImage(painter, boardBitmap.Image(), QRect(0, 0, boardInfo.bmWidth, boardInfo.bmHeight), QPoint(0, 0));
 

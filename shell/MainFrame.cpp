@@ -8,8 +8,7 @@
 #include <QMenuBar>
 #include <QScreen>
 #include <QStyle>
-
-#include <algorithm>
+#include <QtMath>
 
 namespace {
 
@@ -44,27 +43,29 @@ CMainFrame::CMainFrame(QWidget* parent)
 
     const QScreen* screen = this->screen();
     const QSize available = screen ? screen->availableGeometry().size() : QSize(240, 320);
+    const qreal ratio = screen ? screen->devicePixelRatio() : 1.0;
     const QSize chrome(kDecorationWidth, menuBar()->sizeHint().height() + kDecorationHeight);
-    board.setFixedSize(GameWindowSize(ChooseScale(available, chrome)));
+    board.setFixedSize(GameWindowSize(ChooseScale(available, chrome, ratio), ratio));
     // The factors are fixed at the first paint, so the frame keeps its size.
     layout()->setSizeConstraint(QLayout::SetFixedSize);
 }
 
-int CMainFrame::ChooseScale(QSize available, QSize chrome)
+int CMainFrame::ChooseScale(QSize available, QSize chrome, qreal ratio) const
 {
     int scale = 1;
     while (true) {
-        const QSize next = GameWindowSize(scale + 1) + chrome;
+        const QSize next = GameWindowSize(scale + 1, ratio) + chrome;
         if (next.width() > available.width() || next.height() > available.height())
-            break;
+            return scale;
         ++scale;
     }
-    return std::max(1, scale);
 }
 
-QSize CMainFrame::GameWindowSize(int scale)
+QSize CMainFrame::GameWindowSize(int scale, qreal ratio) const
 {
-    return QSize(240 * scale, 320 * scale - 52);
+    // Rounded up, so the device size is at least the one the factor needs.
+    const QSize device = board.DeviceWindowSize(scale);
+    return QSize(qCeil(device.width() / ratio), qCeil(device.height() / ratio));
 }
 
 void CMainFrame::OnAbout()

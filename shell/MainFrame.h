@@ -19,11 +19,12 @@ public:
     GameBoard* Board() { return &board; }
     QMenu* ToolsMenu() const { return toolsMenu; }
 
-    // The largest whole scale factor (at least 1) at which a game window of
-    // 240 s x (320 s - 52) plus the frame's own chrome fits the available area.
-    static int ChooseScale(QSize available, QSize chrome);
-    // The game window's size for a scale factor.
-    static QSize GameWindowSize(int scale);
+    // The largest whole scale factor in device pixels (at least 1) at which the
+    // game window plus the frame's own chrome fits the available area. Sizes
+    // are in window pixels, each `ratio` device pixels wide.
+    int ChooseScale(QSize available, QSize chrome, qreal ratio) const;
+    // The game window's size in window pixels that yields a scale factor.
+    QSize GameWindowSize(int scale, qreal ratio) const;
 
 private:
     void OnAbout();

@@ -2,11 +2,10 @@
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
 
-#include <QMenu>
-#include <QMenuBar>
-#include <QTimer>
+#include <QListWidget>
+#include <QScreen>
 
-// The frame: its scale, its single child, the focus and the New and Exit commands.
+// The frame's size: the largest whole factor in device pixels that fits the screen.
 class FrameTest : public QObject {
     Q_OBJECT
 
@@ -14,21 +13,31 @@ private slots:
     void chooseScale_data()
     {
         QTest::addColumn<QSize>("available");
+        QTest::addColumn<double>("ratio");
         QTest::addColumn<int>("scale");
-        const QSize chrome(16, 70);
-        QTest::newRow("1280 x 1024") << QSize(1280, 1024) << 3;
-        QTest::newRow("1920 x 1080 is limited by height") << QSize(1920, 1080) << 3;
-        QTest::newRow("2560 x 1400") << QSize(2560, 1400) << 4;
-        QTest::newRow("exactly scale 2") << QSize(480, 588) + chrome << 2;
-        QTest::newRow("one pixel short of scale 2") << QSize(480, 587) + chrome << 1;
-        QTest::newRow("tiny screen still 1") << QSize(200, 150) << 1;
+        QTest::newRow("800 x 600") << QSize(800, 600) << 1.0 << 1;
+        QTest::newRow("1920 x 1080 is limited by height") << QSize(1920, 1080) << 1.0 << 3;
+        QTest::newRow("exactly scale 2") << QSize(496, 658) << 1.0 << 2;
+        QTest::newRow("one pixel short of scale 2") << QSize(496, 657) << 1.0 << 1;
+        QTest::newRow("1024 x 768 at 150%") << QSize(683, 512) << 1.5 << 2;
+        QTest::newRow("1920 x 1080 at 125%") << QSize(1536, 864) << 1.25 << 3;
+        QTest::newRow("tiny screen still 1") << QSize(200, 150) << 1.0 << 1;
     }
 
+    // The game window asked for yields exactly the factor, and fits with the
+    // chrome unless the factor is the least.
     void chooseScale()
     {
         QFETCH(QSize, available);
+        QFETCH(double, ratio);
         QFETCH(int, scale);
-        QCOMPARE(CMainFrame::ChooseScale(available, QSize(16, 70)), scale);
+        const QSize chrome(16, 70);
+        CMainFrame frame;
+        QCOMPARE(frame.ChooseScale(available, chrome, ratio), scale);
+        const QSize window = frame.GameWindowSize(scale, ratio);
+        const QSize device = (QSizeF(window) * ratio).toSize();
+        QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), GameBoard::ScaleFactorY(device.height())), QSize(scale, scale));
+        QVERIFY(scale == 1 || available.expandedTo(window + chrome) == available);
     }
 
     void frameHoldsTheGameWindow()
@@ -39,43 +48,14 @@ private slots:
         QVERIFY(QTest::qWaitForWindowExposed(&frame));
         QCOMPARE(frame.windowTitle(), QStringLiteral("Vennick"));
         QCOMPARE(frame.centralWidget(), frame.Board());
-        QCOMPARE(frame.ToolsMenu()->title(), QStringLiteral("Tools"));
-
-        // The game window's size gives whole factors that the first paint takes.
-        frame.Board()->repaint();
-        const int s = frame.Board()->record.scaleX;
-        QVERIFY(s >= 1);
-        QCOMPARE(frame.Board()->record.scaleY, s);
-        QCOMPARE(frame.Board()->size(), CMainFrame::GameWindowSize(s));
-        // Not resizable.
+        GameBoard& board = *frame.Board();
+        board.repaint();
+        QCOMPARE(board.size(), frame.GameWindowSize(board.record.scaleY, 1.0));
         QCOMPARE(frame.minimumSize(), frame.maximumSize());
-
-        // The frame hands the keyboard focus to the game window.
-        frame.activateWindow();
-        frame.setFocus();
-        QVERIFY(QTest::qWaitForWindowActive(&frame));
-        QCOMPARE(QApplication::focusWidget(), frame.Board());
-
-        // Ctrl+N reaches the game window from the frame.
-        frame.Board()->OnDeal();
-        QCOMPARE(frame.Board()->record.phase, int(kPhaseDiscard));
-        QTest::keyClick(&frame, Qt::Key_N, Qt::ControlModifier);
-        QCOMPARE(frame.Board()->record.phase, int(kPhaseNoDeal));
-    }
-
-    void exitEndsTheLoopWithZero()
-    {
-        ClearSettings();
-        CMainFrame frame;
-        QAction* exitAction = nullptr;
-        for (QAction* action : frame.ToolsMenu()->actions())
-            if (action->text() == QStringLiteral("Exit"))
-                exitAction = action;
-        QVERIFY(exitAction);
-        // The application's own loop, as the game runs it.
-        QTimer::singleShot(0, exitAction, &QAction::trigger);
-        QTimer::singleShot(5000, [] { QCoreApplication::exit(7); });
-        QCOMPARE(QCoreApplication::exec(), 0);
+        // The whole log is inside the game window, the frame inside the screen.
+        QVERIFY(board.rect().contains(board.MessageLog()->geometry()));
+        const QSize available = frame.screen()->availableGeometry().size();
+        QCOMPARE(available.expandedTo(frame.frameGeometry().size()), available);
     }
 };
 
