@@ -15,3 +15,13 @@ cmake -S . -B build/check -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo -DVENNICK_W
 cmake --build build/check -j "$jobs"
 echo "== Test suite"
 ctest --test-dir build/check --output-on-failure -j "$jobs"
+
+echo "== Installed desktop entry and AppStream metainfo"
+prefix=$(mktemp -d)
+trap 'rm -rf "$prefix"' EXIT
+cmake --install build/check --prefix "$prefix" > /dev/null
+desktop-file-validate "$prefix/share/applications/org.quorvan.Vennick.desktop"
+appstreamcli validate --no-net "$prefix/share/metainfo/org.quorvan.Vennick.metainfo.xml"
+for icon in "$prefix"/share/icons/hicolor/*/apps; do
+    test -f "$icon/org.quorvan.Vennick.png"
+done
