@@ -120,7 +120,7 @@ void GameBoard::CreateActionButtons()
     const int cx = record.opponentHandSprites[2].rect.right + 1;
     // Ten board pixels of text, counted in device pixels like the images.
     QFont font = this->font();
-    font.setPixelSize(std::max(9, qRound(10 * record.scaleY / devicePixelRatioF())));
+    font.setPixelSize(std::max(1, qRound(10 * record.scaleY / devicePixelRatioF())));
 
     struct ButtonPlace {
         QPushButton** button;
