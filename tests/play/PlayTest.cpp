@@ -127,26 +127,18 @@ void PlayTest::deal()
     ClickButton(b, kCmdSendToCrib);
 
     for (const QString& step : script.split(' ', Qt::SkipEmptyParts)) {
-        const int position = step.size() <= 3 && step != "ok" && step != "ret" && step != "all"
-            ? static_cast<int>(std::find(r.deal + 1, r.deal + 5, Named(step.right(2))) - r.deal) + 1 : 0;
-        if (step.startsWith("you="))
-            b.MovePlayerPegs(step.mid(4).toInt());
-        else if (step.startsWith("opp="))
-            b.MoveOpponentPegs(step.mid(4).toInt());
-        else if (step == "ok")
-            ClickButton(b, ShownButtons(b).value(0));
-        else if (step == "ret")
-            ReleaseEnter(b);
-        else if (step.startsWith('k'))
-            PressKey(b, Qt::Key_0 + position);
-        else if (step != "all")
-            TapHand(b, position);
-        for (int p = 1; step == "all" && p <= 6; ++p) {
-            TapHand(b, p);
-            PressKey(b, Qt::Key_0 + p);
+        const int n = step.mid(4).toInt();
+        if (step == "ok" || step == "ret" || step == "all" || step.contains('=')) {
+            for (int p = 1; step == "all" && p <= 6; ++p) {
+                TapHand(b, p);
+                PressKey(b, Qt::Key_0 + p);
+            }
+            step == "ok" ? ClickButton(b, ShownButtons(b).value(0)) : step.startsWith("you=") ? b.MovePlayerPegs(n)
+                : step.startsWith("opp=") ? b.MoveOpponentPegs(n) : ReleaseEnter(b);
+            continue;
         }
-        if (step == "all")
-            ReleaseEnter(b);
+        const int place = static_cast<int>(std::find(r.deal + 1, r.deal + 5, Named(step.right(2))) - r.deal) + 1;
+        step.startsWith('k') ? PressKey(b, Qt::Key_0 + place) : TapHand(b, place);
     }
     const QString pegs = QStringLiteral("%1-%2 %3-%4").arg(r.playerBackHole).arg(r.playerFrontHole)
                              .arg(r.opponentBackHole).arg(r.opponentFrontHole);
