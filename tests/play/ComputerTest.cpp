@@ -4,11 +4,7 @@
 
 #include <QtTest>
 
-#include <array>
 #include <cstdlib>
-
-using Hand = std::array<CardId, 6>;
-Q_DECLARE_METATYPE(Hand)
 
 // The computer's two decisions, each on hands laid out to show one of its rules.
 class ComputerTest : public QObject {
@@ -23,42 +19,35 @@ private slots:
 
 void ComputerTest::discard_data()
 {
-    QTest::addColumn<Hand>("hand");
+    QTest::addColumn<QString>("hand");
     QTest::addColumn<int>("playerCrib");
-    QTest::addColumn<Hand>("expected");  // the thrown pair at places 0 and 5
+    QTest::addColumn<QString>("expected");  // the thrown pair at places 0 and 5
 
-    const CardId a1 = Card(1, 1), a3 = Card(1, 3), e8 = Card(8, 1), f1 = Card(5, 1), f2 = Card(5, 2), f4 = Card(4, 2);
     // By the count alone the aces and the eight are the best throw; the
     // fives' worth to the crib turns that around when the crib is the
     // computer's. For the user's crib the two aces tie, and the first stays.
-    QTest::newRow("pair of fives thrown to the computer's crib") << Hand{a1, a3, e8, f1, f2, f4} << 0
-                                                                  << Hand{f1, a3, e8, a1, f4, f2};
-    QTest::newRow("pair of fives kept from the user's crib") << Hand{a1, a3, e8, f1, f2, f4} << 1
-                                                              << Hand{a1, a3, f4, f1, f2, e8};
-    const Hand c{Card(11, 2), Card(3, 3), Card(5, 2), Card(6, 2), Card(12, 1), Card(5, 1)};
-    QTest::newRow("best split 1 and 3") << c << 0 << Hand{c[1], c[0], c[2], c[5], c[4], c[3]};
-    const Hand outer{Card(2, 2), Card(2, 1), Card(6, 3), Card(7, 4), Card(2, 4), Card(8, 2)};
-    QTest::newRow("discards already outside") << outer << 1 << outer;
+    QTest::newRow("pair of fives thrown to the computer's crib") << "AS AH 8S 5S 5D 4D" << 0 << "5S AH 8S AS 4D 5D";
+    QTest::newRow("pair of fives kept from the user's crib") << "AS AH 8S 5S 5D 4D" << 1 << "AS AH 4D 5S 5D 8S";
+    QTest::newRow("best split 1 and 3") << "JD 3H 5D 6D QS 5S" << 0 << "3H JD 5D 5S QS 6D";
+    QTest::newRow("discards already outside") << "2D 2S 6H 7C 2C 8D" << 1 << "2D 2S 6H 7C 2C 8D";
     // Equal totals: the three in the earlier place goes, whichever suit.
-    const CardId t = Card(10, 3), s = Card(7, 2), x = Card(3, 3), y = Card(3, 1), e = Card(8, 2), six = Card(6, 2);
-    QTest::newRow("equal totals: the earlier split") << Hand{t, s, x, e, six, y} << 1 << Hand{t, s, y, e, six, x};
-    QTest::newRow("equal totals, threes swapped") << Hand{t, s, y, e, six, x} << 1 << Hand{t, s, x, e, six, y};
+    QTest::newRow("equal totals: the earlier split") << "TH 7D 3H 8D 6D 3S" << 1 << "TH 7D 3S 8D 6D 3H";
+    QTest::newRow("equal totals, threes swapped") << "TH 7D 3S 8D 6D 3H" << 1 << "TH 7D 3H 8D 6D 3S";
     // Both sevens thrown with the eight total the same exactly; summed
     // starter by starter in doubles, rounding puts the second seven ahead.
-    const Hand r{Card(7, 3), Card(7, 1), Card(10, 4), Card(8, 4), Card(3, 2), Card(2, 4)};
-    QTest::newRow("rounding of the running sum decides") << r << 0 << Hand{r[1], r[0], r[2], r[5], r[4], r[3]};
+    QTest::newRow("rounding of the running sum decides") << "7H 7S TC 8C 3D 2C" << 0 << "7S 7H TC 2C 3D 8C";
 }
 
 void ComputerTest::discard()
 {
-    QFETCH(Hand, hand);
+    QFETCH(QString, hand);
     QFETCH(int, playerCrib);
-    QFETCH(Hand, expected);
+    QFETCH(QString, expected);
     auto board = MakeBoard();
     GameRecord& r = board->record;
     for (int p = 0; p < 6; ++p) {
-        r.deal[6 + p] = hand[p];
-        r.opponentHandSprites[p].suit1 = CardSuit(hand[p]) + 1;
+        r.deal[6 + p] = CardNamed(hand.split(' ').value(p));
+        r.opponentHandSprites[p].suit1 = CardSuit(r.deal[6 + p]) + 1;
     }
     r.playerCrib = playerCrib;
     r.phase = kPhaseDiscard;
@@ -66,8 +55,9 @@ void ComputerTest::discard()
     board->ChooseComputerDiscards();
     board->ChooseComputerDiscards();  // once per deal: a second call changes nothing
     for (int p = 0; p < 6; ++p) {
-        QCOMPARE(r.deal[6 + p], expected[p]);
-        QCOMPARE(r.opponentHandSprites[p].suit1, p % 5 == 0 ? kSuitEmpty : CardSuit(expected[p]) + 1);
+        const CardId card = CardNamed(expected.split(' ').value(p));
+        QCOMPARE(r.deal[6 + p], card);
+        QCOMPARE(r.opponentHandSprites[p].suit1, p % 5 == 0 ? kSuitEmpty : CardSuit(card) + 1);
     }
 }
 

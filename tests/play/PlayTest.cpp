@@ -3,20 +3,6 @@
 
 #include <QtTest>
 
-namespace {
-
-// "5H": rank then suit (T ten; suits S D H C as the program numbers them).
-CardId Named(const QString& name)
-{
-    const auto rank1 = QStringLiteral("A23456789TJQK").indexOf(name.left(1)) + 1;
-    const auto suit1 = QStringLiteral("SDHC").indexOf(name.mid(1)) + 1;
-    if (name.size() != 2 || rank1 == 0 || suit1 == 0)
-        qFatal("no such card: %s", qPrintable(name));
-    return Card(static_cast<int>(rank1), static_cast<int>(suit1));
-}
-
-} // namespace
-
 // Deals played through the window: each row stacks the table, plays a script
 // of taps, keys and button presses, and compares what the user then sees: the
 // log since the deal, both pairs of pegs, the count and the button shown.
@@ -116,7 +102,7 @@ void PlayTest::deal()
     const QStringList names = cards.split(' ');
     const int places[13] = {1, 2, 3, 4, 0, 5, 7, 8, 9, 10, 6, 11, 12};
     for (int i = 0; i < 13; ++i)
-        r.deal[places[i]] = Named(names.value(i));
+        r.deal[places[i]] = CardNamed(names.value(i));
     for (int i = 0; i < 6; ++i)
         r.playerHandSprites[i].suit1 = CardSuit(r.deal[i]) + 1;
     for (int i = 1; i <= 4; ++i)
@@ -137,7 +123,7 @@ void PlayTest::deal()
                 : step.startsWith("opp=") ? b.MoveOpponentPegs(n) : ReleaseEnter(b);
             continue;
         }
-        const int place = static_cast<int>(std::find(r.deal + 1, r.deal + 5, Named(step.right(2))) - r.deal) + 1;
+        const int place = static_cast<int>(std::find(r.deal + 1, r.deal + 5, CardNamed(step.right(2))) - r.deal) + 1;
         step.startsWith('k') ? PressKey(b, Qt::Key_0 + place) : TapHand(b, place);
     }
     const QString pegs = QStringLiteral("%1-%2 %3-%4").arg(r.playerBackHole).arg(r.playerFrontHole)
