@@ -8,50 +8,34 @@
 inline int ReferenceCountHand(const CardId cards[5], bool cribRule)
 {
     int points = 0;
-
     for (int subset = 1; subset < 32; ++subset) {
         int sum = 0;
         for (int i = 0; i < 5; ++i)
-            if (subset & (1 << i))
-                sum += CardValue(cards[i]);
-        if (sum == 15)
-            points += 2;
+            sum += subset & (1 << i) ? CardValue(cards[i]) : 0;
+        points += sum == 15 ? 2 : 0;
     }
-
-    int count[13] = {};
+    int count[14] = {};  // one beyond the king, always 0, ends the last stretch
     for (int i = 0; i < 5; ++i)
         ++count[CardRank(cards[i])];
-
-    // Two points for each way of choosing two cards of one rank.
-    for (int c : count)
-        points += c * (c - 1);
-
-    // Each stretch of three or more ranks present, ace low, counts its length
-    // once for every way of picking one card of each of its ranks.
-    for (int low = 0; low < 13;) {
-        int high = low;
-        int ways = 1;
-        while (high < 13 && count[high] > 0)
-            ways *= count[high++];
-        if (high - low >= 3)
-            points += (high - low) * ways;
-        low = high + 1;
+    // Two points for each way of choosing two cards of one rank; each stretch
+    // of three or more ranks present, ace low, counts its length once for
+    // every way of picking one card of each of its ranks.
+    for (int low = 0, high = 0, ways = 1; high < 14; ++high) {
+        points += count[high] * (count[high] - 1);
+        ways *= count[high] > 0 ? count[high] : 1;
+        if (count[high] == 0) {
+            points += high - low >= 3 ? (high - low) * ways : 0;
+            low = high + 1;
+            ways = 1;
+        }
     }
-
-    const int suit = CardSuit(cards[0]);
     int sameSuit = 0;
+    for (int i = 1; i < 4; ++i)
+        sameSuit += CardSuit(cards[i]) == CardSuit(cards[0]) ? 1 : 0;
+    if (sameSuit == 3)
+        points += CardSuit(cards[4]) == CardSuit(cards[0]) ? 5 : cribRule ? 0 : 4;
     for (int i = 0; i < 4; ++i)
-        sameSuit += CardSuit(cards[i]) == suit ? 1 : 0;
-    const bool starterToo = CardSuit(cards[4]) == suit;
-    if (sameSuit == 4 && starterToo)
-        points += 5;
-    else if (sameSuit == 4 && !cribRule)
-        points += 4;
-
-    for (int i = 0; i < 4; ++i)
-        if (CardRank(cards[i]) == 10 && CardSuit(cards[i]) == CardSuit(cards[4]))
-            points += 1;
-
+        points += CardRank(cards[i]) == 10 && CardSuit(cards[i]) == CardSuit(cards[4]) ? 1 : 0;
     return points;
 }
 
@@ -60,13 +44,12 @@ inline int ReferenceCountHand(const CardId cards[5], bool cribRule)
 template <typename Visit>
 void ForEveryHand(Visit visit)
 {
-    CardId cards[5] = {};
-    for (cards[0] = 0; cards[0] < 52; ++cards[0])
-        for (cards[1] = cards[0] + 1; cards[1] < 52; ++cards[1])
-            for (cards[2] = cards[1] + 1; cards[2] < 52; ++cards[2])
-                for (cards[3] = cards[2] + 1; cards[3] < 52; ++cards[3])
-                    for (cards[4] = 0; cards[4] < 52; ++cards[4])
-                        if (cards[4] != cards[0] && cards[4] != cards[1] && cards[4] != cards[2]
-                            && cards[4] != cards[3])
-                            visit(static_cast<const CardId*>(cards));
+    CardId c[5] = {};
+    for (c[0] = 0; c[0] < 52; ++c[0])
+        for (c[1] = c[0] + 1; c[1] < 52; ++c[1])
+            for (c[2] = c[1] + 1; c[2] < 52; ++c[2])
+                for (c[3] = c[2] + 1; c[3] < 52; ++c[3])
+                    for (c[4] = 0; c[4] < 52; ++c[4])
+                        if (c[4] != c[0] && c[4] != c[1] && c[4] != c[2] && c[4] != c[3])
+                            visit(static_cast<const CardId*>(c));
 }

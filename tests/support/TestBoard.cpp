@@ -89,3 +89,12 @@ QStringList LogLines(const GameBoard& board)
             lines.append(log->item(i)->text());
     return lines;
 }
+
+CardId CardNamed(const QString& name)
+{
+    const auto rank1 = QStringLiteral("A23456789TJQK").indexOf(name.left(1)) + 1;
+    const auto suit1 = QStringLiteral("SDHC").indexOf(name.mid(1)) + 1;
+    if (name.size() != 2 || rank1 == 0 || suit1 == 0)
+        qFatal("no such card: %s", qPrintable(name));
+    return Card(static_cast<int>(rank1), static_cast<int>(suit1));
+}

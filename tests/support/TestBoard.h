@@ -29,5 +29,9 @@ void ReleaseEnter(GameBoard& board);            // Return pressed and released
 QList<int> ShownButtons(const GameBoard& board);
 QStringList LogLines(const GameBoard& board);
 
+// A card by name, rank then suit: "5H", "TC" (T ten; suits S D H C as the
+// program numbers them).
+CardId CardNamed(const QString& name);
+
 // Builds a CardId from rank1 (1 ace .. 13 king) and suit1 (1..4).
 constexpr CardId Card(int rank1, int suit1) { return (suit1 - 1) * 13 + (rank1 - 1); }
