@@ -30,26 +30,28 @@ private slots:
     void choosing_data()
     {
         QTest::addColumn<int>("stored");   // the style in the store
-        QTest::addColumn<int>("click");    // the style button clicked, or 0
+        QTest::addColumn<QString>("keys"); // N clicks style N; d, u: arrow down, up
         QTest::addColumn<QString>("end");  // how the dialog is closed
         QTest::addColumn<int>("style");    // the style afterwards
-        QTest::newRow("Wooden; Embossed, OK") << 2 << int(kStyleButtonEmbossed) << "ok" << 3;
-        QTest::newRow("Wooden; Normal, OK") << 2 << int(kStyleButtonNormal) << "ok" << 1;
-        QTest::newRow("Embossed; Wooden, OK") << 3 << int(kStyleButtonWooden) << "ok" << 2;
-        QTest::newRow("Wooden; OK alone saves it") << 2 << 0 << "ok" << 2;
-        QTest::newRow("Wooden; Embossed, Cancel") << 2 << int(kStyleButtonEmbossed) << "cancel" << 2;
-        QTest::newRow("Wooden; Embossed, Escape") << 2 << int(kStyleButtonEmbossed) << "escape" << 2;
-        QTest::newRow("Wooden; Embossed, close box") << 2 << int(kStyleButtonEmbossed) << "close" << 2;
+        QTest::newRow("Wooden; Embossed, OK") << 2 << "3" << "ok" << 3;
+        QTest::newRow("Embossed; Normal, Wooden, OK") << 3 << "12" << "ok" << 2;
+        QTest::newRow("Wooden; OK alone saves it") << 2 << "" << "ok" << 2;
+        QTest::newRow("Wooden; Embossed, Cancel") << 2 << "3" << "cancel" << 2;
+        QTest::newRow("Wooden; Embossed, Escape") << 2 << "3" << "escape" << 2;
+        QTest::newRow("Wooden; Embossed, close box") << 2 << "3" << "close" << 2;
+        QTest::newRow("Wooden; down, Enter") << 2 << "d" << "enter" << 3;
+        QTest::newRow("Embossed; up, up, Enter") << 3 << "uu" << "enter" << 1;
+        QTest::newRow("Normal; Enter") << 1 << "" << "enter" << 1;
         // A damaged style selects no button; confirmed untouched, it is kept.
-        QTest::newRow("7; OK alone keeps it") << 7 << 0 << "ok" << 7;
-        QTest::newRow("0; Normal, OK") << 0 << int(kStyleButtonNormal) << "ok" << 1;
-        QTest::newRow("-1; Cancel") << -1 << 0 << "cancel" << -1;
+        QTest::newRow("7; Enter keeps it") << 7 << "" << "enter" << 7;
+        QTest::newRow("0; Normal, OK") << 0 << "1" << "ok" << 1;
+        QTest::newRow("-1; Cancel") << -1 << "" << "cancel" << -1;
     }
 
     void choosing()
     {
         QFETCH(int, stored);
-        QFETCH(int, click);
+        QFETCH(QString, keys);
         QFETCH(QString, end);
         QFETCH(int, style);
         TempStore store;
@@ -64,33 +66,41 @@ private slots:
 
         QStringList labels;
         QList<int> checkedOnOpen{-1};
-        QList<int> checkedAfterClick;
+        QList<int> checkedAfterKeys;
+        bool focusOnStored = false;
         const bool seen = RunDialog<COptionsDlg>([&] { board->OnOptions(); }, [&](COptionsDlg& dialog) {
             labels = {dialog.windowTitle()};
             for (int id : {kStyleButtonNormal, kStyleButtonWooden, kStyleButtonEmbossed})
                 labels.append(dialog.StyleButton(id)->text());
             checkedOnOpen = CheckedButtons(dialog);
-            if (click != 0) {
-                QTest::mouseClick(dialog.StyleButton(click), Qt::LeftButton);
-                checkedAfterClick = CheckedButtons(dialog);
+            focusOnStored = dialog.focusWidget() && dialog.focusWidget() == dialog.StyleButton(kStyleButtonNormal + stored - 1);
+            for (QChar k : keys) {
+                if (k.isDigit())
+                    QTest::mouseClick(dialog.StyleButton(kStyleButtonNormal + k.digitValue() - 1), Qt::LeftButton);
+                else
+                    QTest::keyClick(dialog.focusWidget(), k == u'd' ? Qt::Key_Down : Qt::Key_Up);
             }
+            checkedAfterKeys = CheckedButtons(dialog);
             if (end == QLatin1String("ok"))
                 QTest::mouseClick(dialog.ButtonBox()->button(QDialogButtonBox::Ok), Qt::LeftButton);
             else if (end == QLatin1String("cancel"))
                 QTest::mouseClick(dialog.ButtonBox()->button(QDialogButtonBox::Cancel), Qt::LeftButton);
-            else if (end == QLatin1String("escape"))
-                QTest::keyClick(&dialog, Qt::Key_Escape);
+            else if (end != QLatin1String("close"))
+                QTest::keyClick(dialog.focusWidget() ? dialog.focusWidget() : &dialog, end == QLatin1String("enter") ? Qt::Key_Return : Qt::Key_Escape);
             else
                 dialog.close();
         });
         QVERIFY2(seen, "no Options dialog was shown");
         QCOMPARE(labels, (QStringList{"Options", "Normal", "Wooden", "Embossed"}));
-        QCOMPARE(checkedOnOpen, stored >= 1 && stored <= 3 ? QList<int>{kStyleButtonNormal + stored - 1} : QList<int>{});
-        if (click != 0)
-            QCOMPARE(checkedAfterClick, QList<int>{click});
+        const bool known = stored >= 1 && stored <= 3;
+        QCOMPARE(checkedOnOpen, known ? QList<int>{kStyleButtonNormal + stored - 1} : QList<int>{});
+        QCOMPARE(focusOnStored, known);  // the keyboard starts on the style shown
+        const bool confirmed = end == QLatin1String("ok") || end == QLatin1String("enter");
+        if (!keys.isEmpty() && confirmed)
+            QCOMPARE(checkedAfterKeys, QList<int>{kStyleButtonNormal + style - 1});
 
         QCOMPARE(board->record.boardStyle, style);
-        QCOMPARE(store.Value(QStringLiteral("Board")).toInt(), end == QLatin1String("ok") ? style : 9);
+        QCOMPARE(store.Value(QStringLiteral("Board")).toInt(), confirmed ? style : 9);
         QVERIFY(ShowsBoard(*board, StyleBitmap(style)));
         // The game goes on untouched, the mouse still reaching it.
         QCOMPARE(board->record.phase, before.phase);
