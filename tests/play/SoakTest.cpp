@@ -155,7 +155,7 @@ private:
             if (Roll(2))
                 ClickButton(b, shown.first());
             else
-                PressKey(b, Roll(2) ? Qt::Key_Escape : Qt::Key_Return);
+                HoldKey(Roll(2) ? Qt::Key_Escape : Qt::Key_Return);
             return;
         }
         QList<int> choices;
@@ -178,8 +178,31 @@ private:
         if (Roll(2))
             TapHand(b, position);
         else
-            PressKey(b, Qt::Key_1 + position - 1);
+            HoldKey(Qt::Key_1 + position - 1);
     }
+
+    // A key tapped, or held: its repeats flagged or as a plain release and
+    // press at one time, as X11 may send them; then released.
+    void HoldKey(int key)
+    {
+        const auto send = [this, key](QEvent::Type type, bool repeat) {
+            QKeyEvent event(type, key, Qt::NoModifier, QString(), repeat);
+            event.setTimestamp(keyClock);
+            QCoreApplication::sendEvent(&b, &event);
+        };
+        keyClock += 1000;
+        send(QEvent::KeyPress, false);
+        for (uint32_t n = Roll(4); n > 0; --n) {
+            keyClock += 33;
+            const bool flagged = Roll(2) != 0;
+            send(QEvent::KeyRelease, flagged);
+            send(QEvent::KeyPress, flagged);
+        }
+        keyClock += 50;
+        send(QEvent::KeyRelease, false);
+        b.ActOnPendingRelease();  // as the next input would
+    }
+    quint64 keyClock = 0;
 
     QString CheckPhase(const QList<int>& shown)
     {

@@ -33,7 +33,7 @@ QStringList Texts(const QList<QAction*>& actions)
 {
     QStringList texts;
     for (const QAction* action : actions)
-        texts.append(action->text());
+        texts.append(action->text() + action->shortcut().toString());
     return texts;
 }
 
@@ -48,8 +48,8 @@ private slots:
     {
         auto frame = MakeFrame();
         QMenuBar* bar = frame->menuBar();
-        QCOMPARE(Texts(bar->actions()), (QStringList{"New", "Tools"}));
-        QCOMPARE(Texts(frame->ToolsMenu()->actions()), (QStringList{"About Vennick...", "Options...", "Exit"}));
+        QCOMPARE(Texts(bar->actions()), (QStringList{"NewCtrl+N", "Tools"}));
+        QCOMPARE(Texts(frame->ToolsMenu()->actions()), (QStringList{"About Vennick...", "Options...", "ExitCtrl+Q"}));
         const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
         QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
         QCoreApplication::sendEvent(bar, &help);
