@@ -130,10 +130,9 @@ void GameBoard::ActOnPendingRelease()
 
 void GameBoard::focusOutEvent(QFocusEvent* event)
 {
-    // Keys held while the focus goes elsewhere are released there.
-    ActOnPendingRelease();
+    // Keys held while the focus goes elsewhere are released there; a release
+    // already seen still acts when its wait ends.
     keysDown.clear();
-    lastRelease = {};
     QWidget::focusOutEvent(event);
 }
 

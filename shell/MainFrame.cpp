@@ -81,7 +81,7 @@ void CMainFrame::OnNew()
 
 bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
 {
-    // A menu bar shows no tooltips of its own actions.
+    // The tooltip of a command on the menu bar itself, such as New.
     if (watched == menuBar() && event->type() == QEvent::ToolTip) {
         const auto* help = static_cast<QHelpEvent*>(event);
         const QAction* action = menuBar()->actionAt(help->pos());
