@@ -3,6 +3,8 @@
 #include "game/GameRecord.h"
 #include "presentation/ImageHolder.h"
 
+#include <QBasicTimer>
+#include <QHash>
 #include <QRect>
 #include <QString>
 #include <QWidget>
@@ -67,6 +69,9 @@ public:
     void SetButtonShown(QPushButton* button, bool shown);
     // The hand position (1..6) a key selects, or 0.
     static int HandPositionKey(int key);
+    // Acts now on a release of Enter or Escape still waiting to prove it is
+    // not a repeat; other input and commands come after it.
+    void ActOnPendingRelease();
 
     // --- game/: message log
     void LogMessage(const QString& text);
@@ -139,15 +144,26 @@ public:
     void SaveSettings();
     void OnOptions();
     void ApplyBoardStyle(int style);
+    bool WriteStore(class QSettings& settings);
     // True while the store lacks values of this run that a save could not
     // write: loading then keeps them rather than going back to older ones.
     bool storeBehind = false;
+    // The tally as this window last read it from the store or wrote it there;
+    // a save adds what was won since to what the store then holds.
+    int32_t storedFor = 0;
+    int32_t storedAgainst = 0;
+
+    // --- game/: the board's tooltip with both scores and whose crib it is
+    QString BoardTip() const;
 
 protected:
     void paintEvent(QPaintEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void keyReleaseEvent(QKeyEvent* event) override;
+    void focusOutEvent(QFocusEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+    bool event(QEvent* event) override;
 
 private:
     void PlaceCountRect();
@@ -165,4 +181,15 @@ private:
     QPushButton* scoreCribButton = nullptr;
     QPushButton* okButton = nullptr;
     QListWidget* messageLog = nullptr;
+
+    // Keys whose press this window saw, with the press's time.
+    QHash<int, quint64> keysDown;
+    struct KeyRelease {
+        int key = 0;
+        quint64 time = 0;
+        quint64 pressTime = 0;
+    };
+    KeyRelease lastRelease;
+    // Runs while the last release of Enter or Escape waits to act.
+    QBasicTimer pendingRelease;
 };

@@ -1,5 +1,6 @@
 #include "game/GameBoard.h"
 
+#include <QFocusEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPushButton>
@@ -19,6 +20,7 @@ void GameBoard::OnCommand(int id)
 
 void GameBoard::mousePressEvent(QMouseEvent* event)
 {
+    ActOnPendingRelease();
     if (event->button() == Qt::LeftButton)
         OnLButtonDown(DevicePoint(event->position()));
     QWidget::mousePressEvent(event);
@@ -51,27 +53,87 @@ int GameBoard::HandPositionKey(int key)
     return 0;
 }
 
+namespace {
+
+// A window system may repeat a held key as a release and a press of the same
+// time; a press this close after a release of its key is taken for a repeat.
+constexpr quint64 kRepeatGap = 5;
+// How long the release of Enter or Escape waits for such a press (ms).
+constexpr int kRepeatWait = 40;
+
+bool IsActionKey(int key)
+{
+    return key == Qt::Key_Return || key == Qt::Key_Enter || key == Qt::Key_Escape;
+}
+
+} // namespace
+
 void GameBoard::keyPressEvent(QKeyEvent* event)
 {
-    if (HandPositionKey(event->key()) == 0 && event->key() != Qt::Key_Return && event->key() != Qt::Key_Enter
-        && event->key() != Qt::Key_Escape) {
+    const int key = event->key();
+    if (HandPositionKey(key) == 0 && !IsActionKey(key)) {
         QWidget::keyPressEvent(event);
         return;
     }
-    // A held key acts once.
-    if (!event->isAutoRepeat())
-        OnKeyDown(event->key());
     event->accept();
+    if (event->isAutoRepeat() || keysDown.contains(key))
+        return;
+    // Events made without a time (0) cannot be told apart and always count.
+    const quint64 time = event->timestamp();
+    if (lastRelease.key == key && time != 0 && time >= lastRelease.time && time - lastRelease.time <= kRepeatGap) {
+        // The key never went up: its release is undone.
+        keysDown.insert(key, lastRelease.pressTime);
+        pendingRelease.stop();
+        lastRelease = {};
+        return;
+    }
+    ActOnPendingRelease();
+    keysDown.insert(key, time);
+    OnKeyDown(key);
 }
 
 void GameBoard::keyReleaseEvent(QKeyEvent* event)
 {
-    if (event->isAutoRepeat()) {
-        event->accept();
+    const int key = event->key();
+    // Only a press this window saw counts: not the one that closed a dialog.
+    if (event->isAutoRepeat() || !keysDown.contains(key)) {
+        QWidget::keyReleaseEvent(event);
         return;
     }
-    OnKeyUp(event->key());
-    QWidget::keyReleaseEvent(event);
+    event->accept();
+    ActOnPendingRelease();
+    lastRelease = {key, event->timestamp(), keysDown.take(key)};
+    if (!IsActionKey(key))
+        return;
+    if (lastRelease.time == 0) {
+        OnKeyUp(key);
+    } else {
+        pendingRelease.start(kRepeatWait, this);
+    }
+}
+
+void GameBoard::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() == pendingRelease.timerId())
+        ActOnPendingRelease();
+    else
+        QWidget::timerEvent(event);
+}
+
+void GameBoard::ActOnPendingRelease()
+{
+    if (!pendingRelease.isActive())
+        return;
+    pendingRelease.stop();
+    OnKeyUp(lastRelease.key);
+}
+
+void GameBoard::focusOutEvent(QFocusEvent* event)
+{
+    // Keys held while the focus goes elsewhere are released there; a release
+    // already seen still acts when its wait ends.
+    keysDown.clear();
+    QWidget::focusOutEvent(event);
 }
 
 void GameBoard::OnKeyDown(int key)

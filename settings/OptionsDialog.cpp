@@ -4,6 +4,7 @@
 
 #include <QButtonGroup>
 #include <QDialogButtonBox>
+#include <QKeyEvent>
 #include <QRadioButton>
 #include <QVBoxLayout>
 
@@ -28,6 +29,7 @@ COptionsDlg::COptionsDlg(QWidget* parent)
         button->setObjectName(QString::number(style.id));
         styleGroup->addButton(button, style.id);
         connect(button, &QRadioButton::clicked, this, style.handler);
+        button->installEventFilter(this);
         layout->addWidget(button, 0, Qt::AlignLeft);
     }
 
@@ -44,6 +46,9 @@ void COptionsDlg::SetSelectedStyle(int32_t style)
 {
     selectedStyle = style;
     ShowSelection();
+    // The keyboard starts on the style shown selected.
+    if (style >= 1 && style <= 3)
+        StyleButton(kStyleButtonNormal + style - 1)->setFocus();
 }
 
 void COptionsDlg::OnNormal()
@@ -59,6 +64,25 @@ void COptionsDlg::OnWooden()
 void COptionsDlg::OnEmbossed()
 {
     SetSelectedStyle(3);
+}
+
+bool COptionsDlg::eventFilter(QObject* watched, QEvent* event)
+{
+    // The arrow keys choose the next or previous style, round the three, as
+    // radio buttons do on every desktop; Qt alone would only move the focus
+    // when no style is selected.
+    if (event->type() == QEvent::KeyPress) {
+        const int key = static_cast<QKeyEvent*>(event)->key();
+        const int step = key == Qt::Key_Down || key == Qt::Key_Right ? 1 : key == Qt::Key_Up || key == Qt::Key_Left ? -1 : 0;
+        const int id = styleGroup->id(qobject_cast<QAbstractButton*>(watched));
+        if (step != 0 && id >= kStyleButtonNormal) {
+            QRadioButton* next = StyleButton(kStyleButtonNormal + (id - kStyleButtonNormal + step + 3) % 3);
+            next->setFocus();
+            next->click();
+            return true;
+        }
+    }
+    return QDialog::eventFilter(watched, event);
 }
 
 QRadioButton* COptionsDlg::StyleButton(int id) const

@@ -34,6 +34,9 @@ public:
     QRadioButton* StyleButton(int id) const;
     QDialogButtonBox* ButtonBox() const { return buttonBox; }
 
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
 private:
     void ShowSelection();
 

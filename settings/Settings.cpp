@@ -3,9 +3,11 @@
 #include "game/GameBoard.h"
 
 #include <QFileInfo>
+#include <QLockFile>
 #include <QSettings>
 #include <QVariant>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdint>
 #include <limits>
@@ -61,19 +63,6 @@ StoreState OpenStore(std::optional<QSettings>& settings)
     return keys.isEmpty() ? StoreState::Missing : StoreState::Present;
 }
 
-// Replaces the store's content with the four values. A damaged file is
-// rewritten clean; a store that cannot be written is left as it is.
-bool WriteStore(QSettings& settings, const GameRecord& r)
-{
-    settings.clear();
-    settings.setValue(QStringLiteral("For"), r.gamesFor);
-    settings.setValue(QStringLiteral("Against"), r.gamesAgainst);
-    settings.setValue(QStringLiteral("Crib"), r.savedPlayerCrib);
-    settings.setValue(QStringLiteral("Board"), r.boardStyle);
-    settings.sync();
-    return settings.status() != QSettings::AccessError;
-}
-
 // Reads a value into field when it is a whole number that fits 32 bits;
 // anything else counts as missing and leaves the field as it was.
 bool ReadInt32(const QSettings& settings, const QString& name, int32_t& field)
@@ -87,6 +76,17 @@ bool ReadInt32(const QSettings& settings, const QString& name, int32_t& field)
         return false;
     field = static_cast<int32_t>(number);
     return true;
+}
+
+// Adds what this window won since it last read or wrote the store to the
+// tally the store holds now, so that two copies on one store lose no game.
+int32_t MergedCount(const QSettings& settings, const QString& name, int32_t inHand, int32_t stored)
+{
+    int32_t now = stored;
+    ReadInt32(settings, name, now);
+    const qint64 merged = qint64(now) + (qint64(inHand) - qint64(stored));
+    return static_cast<int32_t>(std::clamp<qint64>(merged, std::numeric_limits<int32_t>::min(),
+                                                   std::numeric_limits<int32_t>::max()));
 }
 
 } // namespace
@@ -115,6 +115,37 @@ QString SystemOwnerName()
     return kDefaultOwnerName;
 }
 
+// Replaces the store's content with the four values, the tally merged with
+// what the store holds, as one step under a lock beside it. A damaged file is
+// rewritten clean; a store that cannot be written is left as it is.
+bool GameBoard::WriteStore(QSettings& settings)
+{
+    GameRecord& r = record;
+    // Not the ".lock" that QSettings takes for each sync inside this step.
+    QLockFile lock(settings.fileName() + QStringLiteral(".save.lock"));
+    // Another copy holds the lock for a moment only; one that died leaves a
+    // lock taken over at once (its process is gone) or after a second.
+    lock.setStaleLockTime(1000);
+    // Without the lock (an unwritable folder, say) the save still goes ahead.
+    const bool locked = lock.tryLock(1500);
+    settings.sync();
+    r.gamesFor = MergedCount(settings, QStringLiteral("For"), r.gamesFor, storedFor);
+    r.gamesAgainst = MergedCount(settings, QStringLiteral("Against"), r.gamesAgainst, storedAgainst);
+    settings.clear();
+    settings.setValue(QStringLiteral("For"), r.gamesFor);
+    settings.setValue(QStringLiteral("Against"), r.gamesAgainst);
+    settings.setValue(QStringLiteral("Crib"), r.savedPlayerCrib);
+    settings.setValue(QStringLiteral("Board"), r.boardStyle);
+    settings.sync();
+    if (locked)
+        lock.unlock();
+    if (settings.status() == QSettings::AccessError)
+        return false;
+    storedFor = r.gamesFor;
+    storedAgainst = r.gamesAgainst;
+    return true;
+}
+
 void GameBoard::LoadSettings()
 {
     GameRecord& r = record;
@@ -131,7 +162,7 @@ void GameBoard::LoadSettings()
     // brought up to date before it is read back, and where it still cannot be
     // written, the values in hand stay.
     if (state == StoreState::Missing || (state == StoreState::Present && storeBehind)) {
-        if (WriteStore(*settings, r)) {
+        if (WriteStore(*settings)) {
             storeBehind = false;
             state = StoreState::Present;
         } else if (state == StoreState::Missing) {
@@ -149,6 +180,8 @@ void GameBoard::LoadSettings()
             if (ReadInt32(*settings, QStringLiteral("Crib"), crib))
                 r.savedPlayerCrib = crib != 0 ? 1 : 0;
             ReadInt32(*settings, QStringLiteral("Board"), r.boardStyle);
+            storedFor = r.gamesFor;
+            storedAgainst = r.gamesAgainst;
         }
         r.ownerName = SystemOwnerName();
     }
@@ -165,5 +198,5 @@ void GameBoard::SaveSettings()
     std::optional<QSettings> settings;
     // A store that is missing is created by the next load, not here; until
     // then, as when it cannot be written, it is behind this run.
-    storeBehind = !(OpenStore(settings) == StoreState::Present && WriteStore(*settings, record));
+    storeBehind = !(OpenStore(settings) == StoreState::Present && WriteStore(*settings));
 }

@@ -4,10 +4,12 @@
 
 #include <QAction>
 #include <QCoreApplication>
+#include <QHelpEvent>
 #include <QLayout>
 #include <QMenuBar>
 #include <QScreen>
 #include <QStyle>
+#include <QToolTip>
 #include <QtMath>
 
 namespace {
@@ -26,6 +28,14 @@ CMainFrame::CMainFrame(QWidget* parent)
     setCentralWidget(&board);
     setFocusProxy(&board);
 
+    // New sits on the menu bar itself, left of "Tools", as a command of its own.
+    newAction = menuBar()->addAction(QStringLiteral("New"));
+    newAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_N));
+    newAction->setToolTip(QStringLiteral("New game (Ctrl+N)"));
+    connect(newAction, &QAction::triggered, this, &CMainFrame::OnNew);
+    // The shortcut works while the menu bar is hidden or inactive as well.
+    addAction(newAction);
+
     toolsMenu = menuBar()->addMenu(QStringLiteral("Tools"));
     QAction* about = toolsMenu->addAction(QStringLiteral("About Vennick..."));
     connect(about, &QAction::triggered, this, &CMainFrame::OnAbout);
@@ -34,12 +44,7 @@ CMainFrame::CMainFrame(QWidget* parent)
     QAction* exitAction = toolsMenu->addAction(QStringLiteral("Exit"));
     exitAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Q));
     connect(exitAction, &QAction::triggered, this, &CMainFrame::OnExit);
-
-    // New has no menu item; its key works in every phase.
-    auto* newGame = new QAction(QStringLiteral("New"), this);
-    newGame->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_N));
-    connect(newGame, &QAction::triggered, &board, &GameBoard::NewGame);
-    addAction(newGame);
+    menuBar()->installEventFilter(this);
 
     const QScreen* screen = this->screen();
     const QSize available = screen ? screen->availableGeometry().size() : QSize(240, 320);
@@ -68,8 +73,30 @@ QSize CMainFrame::GameWindowSize(int scale, qreal ratio) const
     return QSize(qCeil(device.width() / ratio), qCeil(device.height() / ratio));
 }
 
+void CMainFrame::OnNew()
+{
+    // A release of Enter that came just before acts before the new game.
+    board.ActOnPendingRelease();
+    board.NewGame();
+}
+
+bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
+{
+    // The tooltip of a command on the menu bar itself, such as New.
+    if (watched == menuBar() && event->type() == QEvent::ToolTip) {
+        const auto* help = static_cast<QHelpEvent*>(event);
+        const QAction* action = menuBar()->actionAt(help->pos());
+        if (action != nullptr && action->menu() == nullptr) {
+            QToolTip::showText(help->globalPos(), action->toolTip(), menuBar(), menuBar()->actionGeometry(const_cast<QAction*>(action)));
+            return true;
+        }
+    }
+    return QMainWindow::eventFilter(watched, event);
+}
+
 void CMainFrame::OnAbout()
 {
+    board.ActOnPendingRelease();
     CAboutDlg dialog(this);
     dialog.exec();
     activateWindow();
@@ -78,6 +105,7 @@ void CMainFrame::OnAbout()
 
 void CMainFrame::OnOptionsCommand()
 {
+    board.ActOnPendingRelease();
     board.OnOptions();
     activateWindow();
     board.setFocus();

@@ -8,7 +8,7 @@
 class QAction;
 class QMenu;
 
-// The frame window: the "Tools" menu, the New and Exit keys, and the game
+// The frame window: New and the "Tools" menu on its menu bar, the Exit key, and the game
 // window as its only central child, which always holds the keyboard focus.
 class CMainFrame : public QMainWindow {
     Q_OBJECT
@@ -18,6 +18,7 @@ public:
 
     GameBoard* Board() { return &board; }
     QMenu* ToolsMenu() const { return toolsMenu; }
+    QAction* NewAction() const { return newAction; }
 
     // The largest whole scale factor in device pixels (at least 1) at which the
     // game window plus the frame's own chrome fits the available area. Sizes
@@ -26,11 +27,16 @@ public:
     // The game window's size in window pixels that yields a scale factor.
     QSize GameWindowSize(int scale, qreal ratio) const;
 
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
 private:
+    void OnNew();
     void OnAbout();
     void OnOptionsCommand();
     void OnExit();
 
     GameBoard board;
     QMenu* toolsMenu = nullptr;
+    QAction* newAction = nullptr;
 };

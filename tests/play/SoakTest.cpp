@@ -101,7 +101,7 @@ private:
     {
         const QList<int> shown = ShownButtons(b);
         if (!shown.isEmpty())
-            return Roll(2) ? ClickButton(b, shown.first()) : PressKey(b, Roll(2) ? Qt::Key_Escape : Qt::Key_Return);
+            return Roll(2) ? ClickButton(b, shown.first()) : HoldKey(Roll(2) ? Qt::Key_Escape : Qt::Key_Return);
         QList<int> choices;
         for (int p = 1; p <= 6; ++p) {
             const CardSprite& card = r.playerHandSprites[p - 1];
@@ -113,8 +113,31 @@ private:
         if (choices.isEmpty())
             return Nonsense();  // Check() reports a table that leaves no move
         const int position = choices[Roll(choices.size())];
-        Roll(2) ? TapHand(b, position) : PressKey(b, Qt::Key_0 + position);
+        Roll(2) ? TapHand(b, position) : HoldKey(Qt::Key_0 + position);
     }
+
+    // A key tapped, or held: its repeats flagged or as a plain release and
+    // press at one time, as X11 may send them; then released.
+    void HoldKey(int key)
+    {
+        const auto send = [this, key](QEvent::Type type, bool repeat) {
+            QKeyEvent event(type, key, Qt::NoModifier, QString(), repeat);
+            event.setTimestamp(keyClock);
+            QCoreApplication::sendEvent(&b, &event);
+        };
+        keyClock += 1000;
+        send(QEvent::KeyPress, false);
+        for (uint32_t n = Roll(4); n > 0; --n) {
+            keyClock += 33;
+            const bool flagged = Roll(2) != 0;
+            send(QEvent::KeyRelease, flagged);
+            send(QEvent::KeyPress, flagged);
+        }
+        keyClock += 50;
+        send(QEvent::KeyRelease, false);
+        b.ActOnPendingRelease();  // as the next input would
+    }
+    quint64 keyClock = 0;
 
     // The one button the phase calls for, or none; every card in a hand or laid.
     bool ButtonsFollowRules() const

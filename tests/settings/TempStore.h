@@ -28,12 +28,7 @@ public:
                                               | QFile::ExeOther | QFile::ReadGroup | QFile::ExeGroup);
         QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, dir.path());
     }
-    ~TempStore()
-    {
-        QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, qEnvironmentVariable("XDG_CONFIG_HOME"));
-    }
-    TempStore(const TempStore&) = delete;
-    TempStore& operator=(const TempStore&) = delete;
+    ~TempStore() { QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, qEnvironmentVariable("XDG_CONFIG_HOME")); }
 
     QString Folder() const { return dir.path() + QStringLiteral("/Quorvan"); }
     QString FileName() const { return Folder() + QStringLiteral("/Vennick.conf"); }
@@ -42,8 +37,7 @@ public:
     {
         QDir().mkpath(Folder());
         QFile file(FileName());
-        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
-        QCOMPARE(file.write(content), content.size());
+        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate) && file.write(content) == content.size());
     }
 
     QByteArray Content() const
@@ -51,9 +45,6 @@ public:
         QFile file(FileName());
         return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
     }
-
-    // A stored value as the program reads it; invalid when absent.
-    QVariant Value(const QString& name) const { return QSettings(QStringLiteral("Quorvan"), QStringLiteral("Vennick")).value(name); }
 
 private:
     QTemporaryDir dir;
@@ -68,33 +59,17 @@ public:
         if (active && seteuid(0) == 0)
             (void)setegid(0);
     }
-    Unprivileged(const Unprivileged&) = delete;
-    Unprivileged& operator=(const Unprivileged&) = delete;
 
 private:
     bool active = false;
 };
 
-inline int StyleBitmap(int style)
+// Whether the game window holds the board image of a style (any but 1 and 2 is Embossed).
+inline bool HoldsBoard(const GameBoard& board, int style)
 {
-    return style == 1 ? kBitmapBoardNormal : style == 2 ? kBitmapBoardWooden : kBitmapBoardEmbossed;
-}
-
-// Whether the game window shows this board bitmap pixel for pixel, apart from the pegs on it.
-inline bool ShowsBoard(GameBoard& board, int bitmapId)
-{
-    const QImage shot = board.grab().toImage().convertToFormat(QImage::Format_RGB32);
-    const QImage expected = QImage(BitmapResourcePath(bitmapId)).convertToFormat(QImage::Format_RGB32);
-    const GameRecord& r = board.record;
-    for (int y = 0; y < expected.height(); ++y)
-        for (int x = 0; x < expected.width(); ++x) {
-            bool underPeg = false;
-            for (const Rect& peg : {r.playerBackPegRect, r.playerFrontPegRect, r.opponentBackPegRect, r.opponentFrontPegRect})
-                underPeg = underPeg || peg.Contains(x, y);
-            if (!underPeg && shot.pixel(x * r.scaleX, y * r.scaleY) != expected.pixel(x, y))
-                return false;
-        }
-    return !expected.isNull();
+    const int id = style == 1 ? kBitmapBoardNormal : style == 2 ? kBitmapBoardWooden : kBitmapBoardEmbossed;
+    const QImage expected = QImage(BitmapResourcePath(id)).convertToFormat(QImage::Format_RGB32);
+    return !expected.isNull() && board.boardBitmap.Image().convertToFormat(QImage::Format_RGB32) == expected;
 }
 
 // Triggers a command while action works the modal dialog it opens; says whether

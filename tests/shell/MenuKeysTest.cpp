@@ -1,15 +1,17 @@
 #include "settings/TempStore.h"
+#include "shell/AboutDialog.h"
 #include "shell/MainFrame.h"
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
 
-#include <QDialog>
 #include <QDialogButtonBox>
+#include <QHelpEvent>
+#include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
 #include <QPushButton>
+#include <QToolTip>
 
-#include <algorithm>
 #include <memory>
 
 namespace {
@@ -27,105 +29,62 @@ std::unique_ptr<CMainFrame> MakeFrame()
     return frame;
 }
 
-// Plays a fresh game on to the phase with clicks and taps.
-void ReachPhase(GameBoard& board, int phase)
+QStringList Texts(const QList<QAction*>& actions)
 {
-    if (phase == kPhaseNoDeal)
-        return;
-    // Low cards and a king as starter: nobody comes near the end of a game.
-    StackDeck(board, {Card(1, 1), Card(3, 2), Card(5, 3), Card(7, 4), Card(9, 1), Card(11, 2), Card(2, 3),
-                      Card(4, 4), Card(6, 1), Card(8, 2), Card(10, 3), Card(12, 4), Card(13, 1)});
-    ClickButton(board, kCmdDeal);
-    if (phase == kPhaseGameOver)  // the user's hand carries the game home
-        board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
-    if (phase == kPhaseDiscard || phase == kPhaseGameOver)
-        return;
-    TapHand(board, 1);
-    TapHand(board, 6);
-    ClickButton(board, kCmdSendToCrib);
-    // The play: Ok after each announcement, else the first card that fits.
-    for (int step = 0; step < 64 && phase != kPhasePlay && board.record.phase == kPhasePlay; ++step) {
-        int position = board.IsButtonShown(kCmdOk) ? -1 : 0;
-        for (int p = 2; p <= 5 && position == 0; ++p) {
-            const CardSprite& card = board.record.playerHandSprites[p - 1];
-            if (card.suit1 != kSuitEmpty && board.record.runningCount + Rank1Value(card.rank1) <= 31)
-                position = p;
-        }
-        QVERIFY2(position != 0, "the play waits for a card the user cannot lay");
-        if (position < 0)
-            ClickButton(board, kCmdOk);
-        else
-            TapHand(board, position);
-    }
-    const auto scoreHand = [&board] {
-        ClickButton(board, board.IsButtonShown(kCmdScorePlayerHand) ? kCmdScorePlayerHand : kCmdScoreOpponentHand);
-    };
-    if (phase == kPhaseHandCounted || phase == kPhaseCribCounted)
-        scoreHand();
-    if (phase == kPhaseCribCounted) {
-        scoreHand();
-        ClickButton(board, kCmdScoreCrib);
-    }
-}
-
-bool TableIsEmpty(const GameRecord& r)
-{
-    const auto empty = [](const CardSprite& s) { return s.suit1 == kSuitEmpty; };
-    const auto allEmpty = [&empty](const auto& sprites) { return std::all_of(std::begin(sprites), std::end(sprites), empty); };
-    return allEmpty(r.playerHandSprites) && allEmpty(r.opponentHandSprites) && allEmpty(r.playerPileSprites)
-           && allEmpty(r.opponentPileSprites) && empty(r.starterSprite);
+    QStringList texts;
+    for (const QAction* action : actions)
+        texts.append(action->text() + action->shortcut().toString());
+    return texts;
 }
 
 } // namespace
 
-// The menu, the keys of the frame and where the keyboard goes after a dialog.
+// The menu bar, the keys of the frame and the keys that close a dialog.
 class MenuKeysTest : public QObject {
     Q_OBJECT
 
 private slots:
-    void menuItemsInOrder()
+    void menuBar()
     {
-        CMainFrame frame;
-        QCOMPARE(frame.menuBar()->actions().size(), 1);
-        QStringList items;
-        for (QAction* action : frame.ToolsMenu()->actions())
-            items.append(action->text());
-        QCOMPARE(items, (QStringList{"About Vennick...", "Options...", "Exit"}));
+        auto frame = MakeFrame();
+        QMenuBar* bar = frame->menuBar();
+        QCOMPARE(Texts(bar->actions()), (QStringList{"NewCtrl+N", "Tools"}));
+        QCOMPARE(Texts(frame->ToolsMenu()->actions()), (QStringList{"About Vennick...", "Options...", "ExitCtrl+Q"}));
+        const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
+        QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
+        QCoreApplication::sendEvent(bar, &help);
+        QVERIFY(QToolTip::isVisible() && QToolTip::text().contains(QStringLiteral("Ctrl+N")));
     }
 
-    void newGameFromEveryPhase_data()
+    // New, by its key or on the menu bar: the game won counts, and the first
+    // crib of the new game is the other side's.
+    void newGame_data()
     {
-        QTest::addColumn<int>("phase");
-        QTest::newRow("no deal") << int(kPhaseNoDeal);
-        QTest::newRow("discarding") << int(kPhaseDiscard);
-        QTest::newRow("the play") << int(kPhasePlay);
-        QTest::newRow("play over") << int(kPhasePlayOver);
-        QTest::newRow("a hand counted") << int(kPhaseHandCounted);
-        QTest::newRow("crib counted") << int(kPhaseCribCounted);
-        QTest::newRow("game over") << int(kPhaseGameOver);
+        QTest::addColumn<bool>("byKey");
+        QTest::addColumn<bool>("won");
+        QTest::newRow("Ctrl+N while discarding") << true << false;
+        QTest::newRow("menu bar, game won") << false << true;
     }
 
-    void newGameFromEveryPhase()
+    void newGame()
     {
-        QFETCH(int, phase);
+        QFETCH(bool, byKey);
+        QFETCH(bool, won);
         auto frame = MakeFrame();
         GameBoard& board = *frame->Board();
-        ReachPhase(board, phase);
-        QCOMPARE(board.record.phase, phase);
-
-        QTest::keyClick(frame.get(), Qt::Key_N, Qt::ControlModifier);
-
+        ClickButton(board, kCmdDeal);
+        TapHand(board, 1);
+        if (won)
+            board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
+        if (byKey)
+            QTest::keyClick(frame.get(), Qt::Key_N, Qt::ControlModifier);
+        else
+            QTest::mouseClick(frame->menuBar(), Qt::LeftButton, {},
+                              frame->menuBar()->actionGeometry(frame->NewAction()).center());
         QCOMPARE(board.record.phase, int(kPhaseNoDeal));
-        QCOMPARE(board.record.gameOver, 0);
-        QCOMPARE(board.PlayerScore(), 0);
-        QCOMPARE(board.OpponentScore(), 0);
-        QCOMPARE(board.record.countVisible, 0);
-        QVERIFY(TableIsEmpty(board.record));
+        QCOMPARE(board.PlayerScore() + board.OpponentScore() + board.record.gameOver, 0);
         QCOMPARE(ShownButtons(board), QList<int>{kCmdDeal});
-        // The game just won counts in the tally the new game shows.
-        QCOMPARE(board.record.gamesFor > 0, phase == kPhaseGameOver);
-        QVERIFY(LogLines(board).first().endsWith(QStringLiteral(": ") + QString::number(board.record.gamesFor)));
-        // The first crib of the new game is the other side's.
+        QCOMPARE(LogLines(board).first(), board.record.ownerName + (won ? ": 4" : ": 0"));  // far ahead: 4
         ClickButton(board, kCmdDeal);
         QCOMPARE(LogLines(board).last(), QStringLiteral("Your Crib."));
     }
@@ -139,61 +98,51 @@ private slots:
         QCOMPARE(QCoreApplication::exec(), 0);
     }
 
-    // After a dialog the keyboard reaches the game again, where other Ctrl
-    // keys do nothing.
-    void keysAfterADialog_data()
+    // The key that closes a dialog, and a key held while one opens, never act
+    // on the game; after it the keyboard reaches the game again.
+    void keysAroundDialogs_data()
     {
         QTest::addColumn<int>("item");  // position in the Tools menu
-        QTest::addColumn<bool>("confirm");
-        QTest::newRow("About, OK") << 0 << true;
-        QTest::newRow("About, Escape") << 0 << false;
-        QTest::newRow("Options, OK") << 1 << true;
-        QTest::newRow("Options, Cancel") << 1 << false;
+        QTest::addColumn<int>("key");   // closes the dialog; 0: the mouse does, Enter being held
+        for (int item : {0, 1})
+            for (int key : {int(Qt::Key_Return), int(Qt::Key_Escape), 0})
+                QTest::addRow("%s %x", item ? "Options" : "About", key) << item << key;
     }
 
-    void keysAfterADialog()
+    void keysAroundDialogs()
     {
         QFETCH(int, item);
-        QFETCH(bool, confirm);
+        QFETCH(int, key);
         auto frame = MakeFrame();
         GameBoard& board = *frame->Board();
-        ReachPhase(board, kPhaseDiscard);
-        TapHand(board, 2);
-        const GameRecord before = board.record;
+        ClickButton(board, kCmdDeal);
+        TapHand(board, 1);
+        TapHand(board, 2);  // "Send To Crib" is shown: a leaked key would press it
         const QStringList lines = LogLines(board);
-        QAction* action = frame->ToolsMenu()->actions().at(item);
-        QString shown;
-        const bool seen = RunDialog<QDialog>([action] { action->trigger(); }, [&shown, confirm](QDialog& dialog) {
-            shown = QString::fromLatin1(dialog.metaObject()->className());
-            const auto* box = dialog.findChild<QDialogButtonBox*>();
-            if (QPushButton* button = box->button(confirm ? QDialogButtonBox::Ok : QDialogButtonBox::Cancel))
-                QTest::mouseClick(button, Qt::LeftButton);
-            else  // the About box has no Cancel
-                QTest::keyClick(&dialog, Qt::Key_Escape);
+        if (key == 0)
+            QTest::keyPress(&board, Qt::Key_Return);
+        QStringList texts;
+        const bool seen = RunDialog<QDialog>([&] { frame->ToolsMenu()->actions().at(item)->trigger(); },
+                                             [&](QDialog& dialog) {
+            texts = {dialog.windowTitle()};
+            for (const QLabel* label : dialog.findChildren<QLabel*>())
+                texts.append(label->pixmap().isNull() ? label->text() : QString::number(label->pixmap().width()));
+            if (key != 0)
+                QTest::keyPress(&dialog, static_cast<Qt::Key>(key));
+            else
+                QTest::mouseClick(dialog.findChild<QDialogButtonBox*>()->buttons().first(), Qt::LeftButton);
         });
-        QVERIFY2(seen, "the menu item showed no dialog");
-        QCOMPARE(shown, item == 0 ? "CAboutDlg" : "COptionsDlg");
-        QVERIFY(!QApplication::activeModalWidget());
-
-        // The game window holds the frame's focus, so the next key reaches it as
-        // soon as the frame is active again, which a window manager does when a
-        // dialog closes; there is none offscreen, so it is done here.
-        QCOMPARE(frame->focusWidget(), &board);
-        if (QApplication::activeWindow() != frame.get()) {
-            frame->activateWindow();
-            QVERIFY(QTest::qWaitForWindowActive(frame.get()));
-        }
-        QCOMPARE(QApplication::focusWidget(), &board);
-        for (Qt::Key key : {Qt::Key_O, Qt::Key_S, Qt::Key_Z, Qt::Key_X, Qt::Key_C, Qt::Key_V})
-            QTest::keyClick(&board, key, Qt::ControlModifier);
-        QVERIFY(!frame->isHidden());
-        QVERIFY(!QApplication::activeModalWidget());
-        QCOMPARE(board.record.phase, before.phase);
-        QVERIFY(std::equal(std::begin(before.deal), std::end(before.deal), std::begin(board.record.deal)));
+        QVERIFY(seen);
+        QTest::keyRelease(&board, key ? static_cast<Qt::Key>(key) : Qt::Key_Return);
+        QTest::qWait(60);
+        if (item == 0)
+            QCOMPARE(texts, (QStringList{"About Vennick", "32", "Vennick"}));
+        QCOMPARE(board.record.phase, int(kPhaseDiscard));
         QCOMPARE(LogLines(board), lines);
-        QTest::keyClick(&board, Qt::Key_3);
-        QCOMPARE(board.SelectedCount(), 2);
-        QCOMPARE(board.record.selected[2], 1);
+        frame->activateWindow();  // what a window manager does as a dialog closes
+        QVERIFY(QTest::qWaitForWindowActive(frame.get()));
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_2);
+        QCOMPARE(board.SelectedCount(), 1);
     }
 };
 
