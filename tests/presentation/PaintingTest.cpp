@@ -59,8 +59,7 @@ void CheckScreen(GameBoard& board, int boardId)
                          Places(r.playerPileSprites), Places(&r.starterSprite, 1)})
         for (const CardSprite& s : group)
             DrawCard(scene, s);
-    const int n = r.shownCount;
-    for (const QPoint cell : n < 10 ? QList<QPoint>{{4, n}} : QList<QPoint>{{0, n / 10}, {8, n % 10}})
+    for (const int n = r.shownCount; const QPoint cell : n < 10 ? QList<QPoint>{{4, n}} : QList<QPoint>{{0, n / 10}, {8, n % 10}})
         if (r.countVisible)
             scene.drawImage(r.countRect.left + cell.x(), r.countRect.top, Art(kBitmapDigits), 8 * cell.y(), 0, 8, 8);
     scene.end();
