@@ -1,0 +1,31 @@
+#include "support/TestBoard.h"
+#include "support/TestMain.h"
+
+#include "shell/GameApp.h"
+#include "shell/MainFrame.h"
+
+#include <QScreen>
+
+// The program's start-up, as main runs it: the frame, the first paint, the focus.
+class StartupTest : public QObject {
+    Q_OBJECT
+
+private slots:
+    void startsAsMainDoes()
+    {
+        auto* app = qobject_cast<CGameApp*>(QCoreApplication::instance());
+        QVERIFY(app && app->InitInstance());
+        CMainFrame* frame = app->MainFrame();
+        QVERIFY(frame && QTest::qWaitForWindowActive(frame));
+        GameBoard* board = frame->Board();
+        QTRY_COMPARE(board->record.firstPaintPending, 0);
+        QCOMPARE(ShownButtons(*board), QList<int>{kCmdDeal});
+        QCOMPARE(LogLines(*board).mid(2), QStringList{"Click Deal to start a new game."});  // the third of three
+        QTRY_COMPARE(QApplication::focusWidget(), static_cast<QWidget*>(board));
+        QVERIFY(frame->screen()->availableGeometry().contains(frame->frameGeometry()));
+        frame->hide();  // out of the way of the suites that run after this one
+    }
+};
+
+VENNICK_TEST(StartupTest);
+#include "StartupTest.moc"
