@@ -1,17 +1,123 @@
+#include "play/PlaySequence.h"
+#include "play/ReferencePlay.h"
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
 
 #include <QtTest>
 
-// Deals played through the window: each row stacks the table, plays a script
-// of taps, keys and button presses, and compares what the user then sees: the
-// log since the deal, both pairs of pegs, the count and the button shown.
+#include <cstdlib>
+
+// The play and the show: deals played through the window, the computer's two
+// decisions on hands laid out to show its rules, and the play scorer against
+// the plain reference.
 class PlayTest : public QObject {
     Q_OBJECT
 
 private slots:
     void deal_data();
     void deal();
+    void discard_data()
+    {
+        QTest::addColumn<QString>("hand");
+        QTest::addColumn<int>("playerCrib");
+        QTest::addColumn<QString>("expected");  // the thrown pair at places 0 and 5
+
+        // By the count alone the aces and the eight are the best throw; the
+        // fives' worth to the crib turns that around when the crib is the
+        // computer's. For the user's crib the two aces tie, and the first stays.
+        QTest::newRow("pair of fives thrown to the computer's crib") << "AS AH 8S 5S 5D 4D" << 0 << "5S AH 8S AS 4D 5D";
+        QTest::newRow("pair of fives kept from the user's crib") << "AS AH 8S 5S 5D 4D" << 1 << "AS AH 4D 5S 5D 8S";
+        QTest::newRow("best split 1 and 3") << "JD 3H 5D 6D QS 5S" << 0 << "3H JD 5D 5S QS 6D";
+        QTest::newRow("discards already outside") << "2D 2S 6H 7C 2C 8D" << 1 << "2D 2S 6H 7C 2C 8D";
+        // Equal totals: the three in the earlier place goes, whichever suit.
+        QTest::newRow("equal totals: the earlier split") << "TH 7D 3H 8D 6D 3S" << 1 << "TH 7D 3S 8D 6D 3H";
+        QTest::newRow("equal totals, threes swapped") << "TH 7D 3S 8D 6D 3H" << 1 << "TH 7D 3H 8D 6D 3S";
+        // Both sevens thrown with the eight total the same exactly; summed
+        // starter by starter in doubles, rounding puts the second seven ahead.
+        QTest::newRow("rounding of the running sum decides") << "7H 7S TC 8C 3D 2C" << 0 << "7S 7H TC 2C 3D 8C";
+    }
+
+    void discard()
+    {
+        QFETCH(QString, hand);
+        QFETCH(int, playerCrib);
+        QFETCH(QString, expected);
+        auto board = MakeBoard();
+        GameRecord& r = board->record;
+        for (int p = 0; p < 6; ++p)
+            r.opponentHandSprites[p].suit1 = CardSuit(r.deal[6 + p] = CardNamed(hand.split(' ').value(p))) + 1;
+        r.playerCrib = playerCrib;
+        r.phase = kPhaseDiscard;
+        board->ChooseComputerDiscards();
+        board->ChooseComputerDiscards();  // once per deal: a second call changes nothing
+        for (int p = 0; p < 6; ++p) {
+            const CardId card = CardNamed(expected.split(' ').value(p));
+            QCOMPARE(r.deal[6 + p], card);
+            QCOMPARE(r.opponentHandSprites[p].suit1, p % 5 == 0 ? kSuitEmpty : CardSuit(card) + 1);
+        }
+    }
+
+    void card_data()
+    {
+        QTest::addColumn<QList<int>>("hand");  // rank1 at places 1..4; negative: already laid
+        QTest::addColumn<QList<int>>("laid");  // the ranks of the count so far
+        QTest::addColumn<int>("expected");     // the place chosen, 0 for none
+
+        QTest::newRow("no card fits") << QList<int>{5, 9, 13, 4} << QList<int>{10, 10, 8} << 0;
+        QTest::newRow("every card laid") << QList<int>{-1, -2, -6, -4} << QList<int>{3} << 0;
+        QTest::newRow("only the six fits under 31") << QList<int>{9, 6, 13, 8} << QList<int>{10, 10, 5} << 2;
+        QTest::newRow("a laid five is not offered") << QList<int>{-5, 2, 9, 12} << QList<int>{10} << 2;
+        QTest::newRow("the five makes fifteen") << QList<int>{5, 9, 2, 13} << QList<int>{10} << 1;
+        QTest::newRow("a later scorer takes the lead") << QList<int>{2, 9, 5, 13} << QList<int>{10} << 3;
+        QTest::newRow("a run of 3 beats 31; the earlier run wins") << QList<int>{4, 7, 13, 2} << QList<int>{10, 6, 5} << 1;
+        QTest::newRow("equal scores keep the earlier") << QList<int>{10, 5, 2, 3} << QList<int>{10} << 1;
+        QTest::newRow("lead: the four gives least away") << QList<int>{5, 13, 4, 2} << QList<int>{} << 3;
+        QTest::newRow("lead: the first of two equal cards") << QList<int>{13, 4, 4, 5} << QList<int>{} << 2;
+        // The two is judged against the replies the five leaves room for (a five
+        // or a six), not those the two itself would allow (a two or a nine).
+        QTest::newRow("replies those the chosen card leaves room for") << QList<int>{5, 2, -3, -4} << QList<int>{10, 13} << 2;
+    }
+
+    void card()
+    {
+        QFETCH(QList<int>, hand);
+        QFETCH(QList<int>, laid);
+        QFETCH(int, expected);
+        auto board = MakeBoard();
+        GameRecord& r = board->record;
+        r.phase = kPhasePlay;
+        for (int rank1 : laid) {
+            SequenceAppend(r.playSequence, rank1);
+            r.runningCount += Rank1Value(rank1);
+        }
+        for (int p = 1; p <= 4; ++p) {
+            r.deal[6 + p] = Card(std::abs(hand[p - 1]), p);  // a suit per place: no card twice
+            r.opponentHandSprites[p].suit1 = hand[p - 1] < 0 ? kSuitEmpty : p;
+        }
+        r.opponentHandSprites[0].suit1 = r.opponentHandSprites[5].suit1 = kSuitEmpty;
+        QCOMPARE(board->ChooseComputerCard(), expected);
+    }
+
+    // Every sequence the play can produce of up to five cards always, all of
+    // up to eight on request (VENNICK_EXHAUSTIVE=1), as that is slow under
+    // the sanitizers.
+    void scoreAgreesWithReference()
+    {
+        const bool everything = qEnvironmentVariableIntValue("VENNICK_EXHAUSTIVE") != 0;
+        long long visited = 0;
+        QString first;
+        ForEveryLegalPlay(everything ? 8 : 5, [&](const PlaySequence& sequence) {
+            ++visited;
+            PlaySequence rebuilt;  // the same cards appended one by one
+            for (int i = 0; i < SequenceLength(sequence); ++i)
+                SequenceAppend(rebuilt, sequence.entries[i]);
+            if (first.isEmpty() && (ScorePlay(rebuilt) != ReferenceScorePlay(sequence) || rebuilt.entries[8] != -1))
+                for (int entry : sequence.entries)
+                    first += QString::number(entry) + QLatin1Char(' ');
+        });
+        QVERIFY2(first.isEmpty(), qPrintable(first));
+        QCOMPARE(visited, everything ? 12892167LL : 182587LL);
+    }
 };
 
 void PlayTest::deal_data()
@@ -30,8 +136,7 @@ void PlayTest::deal_data()
     const QString runsTo31 = "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC 5H";  // the computer deals
     const QString lastCardGo = "AS AH 6D QH AD 3D 4S 2S 2C 4H 7D QD 9C";  // the user deals
     const QString repeatedGo = "AS 2S 7D KH 3H 4H QD JC TS 9H 5C 6C 8C";  // the computer deals
-    const QString go = "Opponent says: 'Go' / ";
-    const QString won = "You won. / Please click New to play again.";
+    const QString go = "Opponent says: 'Go' / ", won = "You won. / Please click New to play again.";
 
     // The play.
     QTest::newRow("user's 31; no card while Ok shows; the computer leads after it; no double go")
@@ -39,13 +144,12 @@ void PlayTest::deal_data()
         << "You peg 2. / Opponent pegs 1 for a go. | 0-2 0-1 | 0 | 4";
     QTest::newRow("computer's 31 laid two cards at once; the user leads; user's go")
         << runsTo31 << false << "2S 8D TH QC" << "Opponent pegs 2. / You peg 1 for a go. | 0-1 0-2 | 0 | 4";
-    QTest::newRow("go repeated until the user pegs it, by keyboard")
-        << repeatedGo << false << "kKH k7D kAS k2S ret"
+    QTest::newRow("go repeated until the user pegs it, by keyboard") << repeatedGo << false << "kKH k7D kAS k2S ret"
         << go + go + "You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 0-1 | 0 | 4";
     QTest::newRow("computer's last card takes its point unannounced")
         << "AS AD 2H 3C 9S TS 3D 7S 5H 7H KD QD 6C" << false << "AS AD 2H 3C" << "Opponent pegs 2. | 122-0 0-3 | 0 | 4";
-    QTest::newRow("after the computer's go the user leads")
-        << "AC 7C TD JD 2H 3H 8H JS QS TS 4D 5D 6C" << false << "AC 7C TD JD ok"
+    QTest::newRow("after the computer's go the user leads") << "AC 7C TD JD 2H 3H 8H JS QS TS 4D 5D 6C" << false
+        << "AC 7C TD JD ok"
         << "Opponent pegs 1 for a go. / Opponent pegs 2. / You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 3-4 | 0 | 4";
     QTest::newRow("computer waits for Ok after scoring while the user is stuck")
         << "8S 9S TS KS AC 3C 5D 2D 2H 2C 6H 7H 4D" << false << "8S 9S ok TS KS"
@@ -59,26 +163,21 @@ void PlayTest::deal_data()
     QTest::newRow("His Heels for the computer; the user leads")
         << "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC JH" << false << "2S" << "Opponent pegs 2 for His Heels. | 122-0 0-2 | 12 | 0";
     // The show: the non-dealer's hand, the dealer's, then the crib.
-    QTest::newRow("show after the computer's deal")
-        << runsTo31 << false << "2S 8D TH QC ok ok ok"
+    QTest::newRow("show after the computer's deal") << runsTo31 << false << "2S 8D TH QC ok ok ok"
         << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / Opponent pegs 12 for his hand. / "
            "Opponent pegs 6 for the crib. | 1-7 14-20 | 0 | 1";
     // Four of a suit with a starter of another: a flush in a hand, none in the crib.
-    QTest::newRow("show after the user's deal, by keyboard")
-        << lastCardGo << true << "AS AH 6D QH ret ret ret"
+    QTest::newRow("show after the user's deal, by keyboard") << lastCardGo << true << "AS AH 6D QH ret ret ret"
         << "You peg 1 for a go. / Opponent pegs 12 for his hand. / You peg 4 for your hand. / You peg 0 for the crib. "
            "| 1-5 0-12 | 0 | 1";
     // A win ends the deal where it stands: no button, and nothing moves.
     QTest::newRow("a go point wins on the last card")
         << lastCardGo << true << "you=120 AS AH 6D QH all" << "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0";
-    QTest::newRow("a go point wins with the computer's cards in hand")
-        << repeatedGo << false << "you=120 KH 7D AS 2S all"
+    QTest::newRow("a go point wins with the computer's cards in hand") << repeatedGo << false << "you=120 KH 7D AS 2S all"
         << go + go + "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0";
-    QTest::newRow("user wins on the first count")
-        << runsTo31 << false << "you=115 2S 8D TH QC ok all"
+    QTest::newRow("user wins on the first count") << runsTo31 << false << "you=115 2S 8D TH QC ok all"
         << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / " + won + " | 116-121 0-2 | 0 | 0";
-    QTest::newRow("computer wins on the first count")
-        << lastCardGo << true << "opp=110 AS AH 6D QH ok all"
+    QTest::newRow("computer wins on the first count") << lastCardGo << true << "opp=110 AS AH 6D QH ok all"
         << "You peg 1 for a go. / Opponent pegs 12 for his hand. / You lost. / Please click New to play again. "
            "| 0-1 110-121 | 0 | 0";
 }
@@ -99,10 +198,9 @@ void PlayTest::deal()
     // computer's own discard, and send the user's two to the crib.
     r.playerCrib = userDeals ? 0 : 1;  // every deal passes the crib over
     ClickButton(b, kCmdDeal);
-    const QStringList names = cards.split(' ');
     const int places[13] = {1, 2, 3, 4, 0, 5, 7, 8, 9, 10, 6, 11, 12};
     for (int i = 0; i < 13; ++i)
-        r.deal[places[i]] = CardNamed(names.value(i));
+        r.deal[places[i]] = CardNamed(cards.split(' ').value(i));
     for (int i = 0; i < 6; ++i)
         r.playerHandSprites[i].suit1 = CardSuit(r.deal[i]) + 1;
     for (int i = 1; i <= 4; ++i)

@@ -12,9 +12,7 @@ inline int ReferenceScorePlay(const PlaySequence& sequence)
 {
     const int32_t* e = sequence.entries;
     const int n = static_cast<int>(std::find(e, e + 9, -1) - e);
-    if (n == 0)
-        return 0;
-    int points = 0;
+    int points = 0, total = 0;
     for (int i = n - 2, step = 2; i >= 0 && e[i] == e[n - 1]; --i, step += 2)
         points += step;
     for (int length = n; length >= 3; --length) {
@@ -26,7 +24,6 @@ inline int ReferenceScorePlay(const PlaySequence& sequence)
             break;
         }
     }
-    int64_t total = 0;
     for (int i = 0; i < n; ++i)
         total += Rank1Value(e[i]);
     return points + (total == 15 || total == 31 ? 2 : 0);

@@ -5,7 +5,6 @@
 #include <QSettings>
 #include <QtTest>
 
-#include <memory>
 #include <random>
 
 namespace {
@@ -18,26 +17,35 @@ bool Shows(const CardSprite& sprite, CardId card)
     return sprite.rank1 == CardRank(card) + 1 && sprite.suit1 == CardSuit(card) + 1;
 }
 
-// A scripted user: random legal moves with random nonsense mixed in, and the
-// table checked after every action.
-class ScriptedUser {
-public:
-    ScriptedUser(GameBoard& board, uint32_t seed) : b(board), r(board.record), rng(seed)
+} // namespace
+
+// Whole games against the computer, from the first deal to 121, by a scripted
+// user who makes random legal moves with random nonsense mixed in, and the
+// table checked after every action. VENNICK_SOAK_GAMES raises the count; the
+// games are played in rounds, one data row each, so that Qt Test's limit per
+// test function applies to a round, not to the whole run.
+class SoakTest : public QObject {
+    Q_OBJECT
+
+private slots:
+    void initTestCase() { b.randomSource = [this]() { return static_cast<int>(rng() >> 1); }; }
+    void wholeGames_data()
     {
-        b.randomSource = [this]() { return static_cast<int>(rng() >> 1); };
-        StartTracking();
+        QTest::addColumn<int>("games");
+        const int asked = qEnvironmentVariableIntValue("VENNICK_SOAK_GAMES");
+        for (int left = asked > 0 ? asked : 300, round = 1; left > 0; left -= kGamesPerRound, ++round)
+            QTest::addRow("round %d", round) << std::min(left, kGamesPerRound);
     }
+    void wholeGames();
+
+private:
+    uint32_t Roll(size_t n) { return static_cast<uint32_t>(rng() % n); }
 
     // One action of the user. Returns false when it was New in mid-game.
     bool Act()
     {
         const uint32_t roll = Roll(10000);
-        if (roll < 2)
-            b.NewGame();  // the New command, here in the middle of a game
-        else if (roll < 800)
-            Nonsense();
-        else
-            LegalMove();
+        roll < 2 ? b.NewGame() : roll < 800 ? Nonsense() : LegalMove();
         return roll >= 2;
     }
 
@@ -48,68 +56,21 @@ public:
                                    Qt::Key_Down, Qt::Key_Left, Qt::Key_Right, Qt::Key_A, Qt::Key_N, Qt::Key_Space,
                                    Qt::Key_Tab, Qt::Key_F1, Qt::Key_Backspace, Qt::Key_Escape, Qt::Key_Return};
         const uint32_t kind = Roll(3);
-        if (kind == 0)
-            TapBoard(b, static_cast<int>(Roll(240)), static_cast<int>(Roll(268)));
-        else if (kind == 1)
-            TapHand(b, static_cast<int>(Roll(6)) + 1);
-        else
-            PressKey(b, keys[Roll(std::size(keys))]);
+        kind == 0   ? TapBoard(b, int(Roll(240)), int(Roll(268)))
+            : kind == 1 ? TapHand(b, int(Roll(6)) + 1) : PressKey(b, keys[Roll(std::size(keys))]);
     }
-
-    // The first broken rule, or an empty text.
-    QString Check()
-    {
-        for (int i = 0; r.phase != kPhaseNoDeal && i < 13; ++i)
-            if (r.deal[i] < 0 || r.deal[i] > 51 || std::count(r.deal, r.deal + i, r.deal[i]) != 0)
-                return QStringLiteral("a card out of range or dealt twice");
-        const int you = b.PlayerScore();
-        const int opponent = b.OpponentScore();
-        if (you < lastYou || opponent < lastOpponent || you > kGameHole || opponent > kGameHole)
-            return QStringLiteral("a score went down or past 121");
-        lastYou = you;
-        lastOpponent = opponent;
-        for (auto [back, front] : {std::pair(r.playerBackHole, you), std::pair(r.opponentBackHole, opponent)})
-            if (back >= front && !(back == kBackStartHole && front == kStartHole))
-                return QStringLiteral("back peg not behind the front peg");
-        int total = 0;
-        for (int i = 0; i < 9 && r.playSequence.entries[i] != -1; ++i)
-            total += Rank1Value(r.playSequence.entries[i]);
-        if (total != r.runningCount || total > 31)
-            return QStringLiteral("running count differs from the cards of the count");
-        if (!ButtonsFollowRules())
-            return QStringLiteral("phase %1 with buttons [%2]").arg(r.phase).arg(ShownButtons(b).size());
-        if (QString broken = CheckCards(); !broken.isEmpty())
-            return broken;
-        return CheckGameEnd();
-    }
-
-    void StartTracking()
-    {
-        lastYou = lastOpponent = 0;
-        ended = false;
-        tallyFor = r.gamesFor;
-        tallyAgainst = r.gamesAgainst;
-    }
-
-    bool Ended() const { return ended; }
-
-private:
-    uint32_t Roll(size_t n) { return static_cast<uint32_t>(rng() % n); }
 
     // A move the rules allow, by mouse or keyboard at random.
     void LegalMove()
     {
-        const QList<int> shown = ShownButtons(b);
-        if (!shown.isEmpty())
+        if (const QList<int> shown = ShownButtons(b); !shown.isEmpty())
             return Roll(2) ? ClickButton(b, shown.first()) : HoldKey(Roll(2) ? Qt::Key_Escape : Qt::Key_Return);
         QList<int> choices;
-        for (int p = 1; p <= 6; ++p) {
-            const CardSprite& card = r.playerHandSprites[p - 1];
-            if ((r.phase == kPhaseDiscard && !r.selected[p - 1])
-                || (r.phase == kPhasePlay && p >= 2 && p <= 5 && card.suit1 != kSuitEmpty
-                    && r.runningCount + Rank1Value(card.rank1) <= 31))
+        for (int p = 1; p <= 6; ++p)
+            if (const CardSprite& card = r.playerHandSprites[p - 1]; r.phase == kPhaseDiscard ? !r.selected[p - 1]
+                : r.phase == kPhasePlay && p >= 2 && p <= 5 && card.suit1 != kSuitEmpty
+                    && r.runningCount + Rank1Value(card.rank1) <= 31)
                 choices.append(p);
-        }
         if (choices.isEmpty())
             return Nonsense();  // Check() reports a table that leaves no move
         const int position = choices[Roll(choices.size())];
@@ -120,24 +81,44 @@ private:
     // press at one time, as X11 may send them; then released.
     void HoldKey(int key)
     {
-        const auto send = [this, key](QEvent::Type type, bool repeat) {
+        const auto send = [this, key](QEvent::Type type, bool repeat, quint64 later = 0) {
             QKeyEvent event(type, key, Qt::NoModifier, QString(), repeat);
-            event.setTimestamp(keyClock);
+            event.setTimestamp(keyClock += later);
             QCoreApplication::sendEvent(&b, &event);
         };
-        keyClock += 1000;
-        send(QEvent::KeyPress, false);
+        send(QEvent::KeyPress, false, 1000);
         for (uint32_t n = Roll(4); n > 0; --n) {
-            keyClock += 33;
             const bool flagged = Roll(2) != 0;
-            send(QEvent::KeyRelease, flagged);
+            send(QEvent::KeyRelease, flagged, 33);
             send(QEvent::KeyPress, flagged);
         }
-        keyClock += 50;
-        send(QEvent::KeyRelease, false);
+        send(QEvent::KeyRelease, false, 50);
         b.ActOnPendingRelease();  // as the next input would
     }
-    quint64 keyClock = 0;
+
+    // The first broken rule, or an empty text.
+    QString Check()
+    {
+        for (int i = 0; r.phase != kPhaseNoDeal && i < 13; ++i)
+            if (r.deal[i] < 0 || r.deal[i] > 51 || std::count(r.deal, r.deal + i, r.deal[i]) != 0)
+                return "a card out of range or dealt twice";
+        const int you = b.PlayerScore(), opponent = b.OpponentScore();
+        if (you < lastYou || opponent < lastOpponent || you > kGameHole || opponent > kGameHole)
+            return "a score went down or past 121";
+        std::tie(lastYou, lastOpponent) = std::pair(you, opponent);
+        for (auto [back, front] : {std::pair(r.playerBackHole, you), std::pair(r.opponentBackHole, opponent)})
+            if (back >= front && !(back == kBackStartHole && front == kStartHole))
+                return "back peg not behind the front peg";
+        int total = 0;
+        for (int i = 0; i < 9 && r.playSequence.entries[i] != -1; ++i)
+            total += Rank1Value(r.playSequence.entries[i]);
+        if (total != r.runningCount || total > 31)
+            return "running count differs from the cards of the count";
+        if (!ButtonsFollowRules())
+            return QStringLiteral("phase %1 with buttons [%2]").arg(r.phase).arg(ShownButtons(b).size());
+        const QString broken = CheckCards();
+        return broken.isEmpty() ? CheckGameEnd() : broken;
+    }
 
     // The one button the phase calls for, or none; every card in a hand or laid.
     bool ButtonsFollowRules() const
@@ -147,15 +128,13 @@ private:
         int inHands = 0;
         for (int p = 0; p < 6; ++p)
             inHands += (r.playerHandSprites[p].suit1 != kSuitEmpty) + (r.opponentHandSprites[p].suit1 != kSuitEmpty);
-        const int dealersHand = r.playerCrib ? kCmdScorePlayerHand : kCmdScoreOpponentHand;
         if (r.gameOver)
             return one == 0 && (r.phase == kPhaseGameOver || r.phase == kPhaseHandCounted)
                 && (b.PlayerScore() == kGameHole) != (b.OpponentScore() == kGameHole);
         if (b.PlayerScore() == kGameHole || b.OpponentScore() == kGameHole)
             return false;
         switch (r.phase) {
-        case kPhaseNoDeal:
-        case kPhaseCribCounted: return one == kCmdDeal;
+        case kPhaseNoDeal: case kPhaseCribCounted: return one == kCmdDeal;
         case kPhaseDiscard: return b.SelectedCount() <= 2 && one == (b.SelectedCount() == 2 ? kCmdSendToCrib : 0);
         case kPhasePlay:
             return inHands + r.playerPlayIndex + r.opponentPlayIndex == 10
@@ -163,7 +142,8 @@ private:
         case kPhasePlayOver:
             return r.playerPlayIndex == 5 && r.opponentPlayIndex == 5
                 && one == (r.playerCrib ? kCmdScoreOpponentHand : kCmdScorePlayerHand);
-        case kPhaseHandCounted: return one == dealersHand || one == kCmdScoreCrib;
+        case kPhaseHandCounted:
+            return one == (r.playerCrib ? kCmdScorePlayerHand : kCmdScoreOpponentHand) || one == kCmdScoreCrib;
         default: return false;
         }
     }
@@ -191,103 +171,75 @@ private:
             }
         }
         const bool faceUp = r.starterSprite.suit1 != kSuitBack && r.starterSprite.suit1 != kSuitEmpty;
-        return faceUp && !Shows(r.starterSprite, r.deal[12]) ? QStringLiteral("the starter shows another card") : "";
+        return faceUp && !Shows(r.starterSprite, r.deal[12]) ? "the starter shows another card" : "";
     }
 
+    // Once per game, as it ends: the tally grows for the winner by the
+    // loser's distance, is stored, and the end is announced once and last.
     QString CheckGameEnd()
     {
-        const bool tallySame = r.gamesFor == tallyFor && r.gamesAgainst == tallyAgainst;
         if (!r.gameOver || ended)
-            return ended != (r.gameOver != 0) ? QStringLiteral("the game came back to life")
-                : tallySame ? QString() : QStringLiteral("the tally changed during a game or twice");
+            return ended != (r.gameOver != 0) ? "the game came back to life"
+                : r.gamesFor == tallyFor && r.gamesAgainst == tallyAgainst ? "" : "the tally changed during a game or twice";
         ended = true;
         const bool userWon = b.PlayerScore() == kGameHole;
         const int loser = userWon ? b.OpponentScore() : b.PlayerScore();
         const int32_t games = loser <= 60 ? 4 : loser <= 90 ? 2 : 1;
         if (r.gamesFor != tallyFor + (userWon ? games : 0) || r.gamesAgainst != tallyAgainst + (userWon ? 0 : games))
-            return QStringLiteral("the tally did not grow by 1, 2 or 4 for the winner");
+            return "the tally did not grow by 1, 2 or 4 for the winner";
         const QSettings stored(QStringLiteral("Quorvan"), QStringLiteral("Vennick"));
         if (stored.value("For").toInt() != r.gamesFor || stored.value("Against").toInt() != r.gamesAgainst)
-            return QStringLiteral("the tally was not saved");
+            return "the tally was not saved";
         const QStringList log = LogLines(b);
         if (log.mid(log.size() - 2) != QStringList{userWon ? "You won." : "You lost.", "Please click New to play again."}
             || log.count(QStringLiteral("You won.")) + log.count(QStringLiteral("You lost.")) != 1)
-            return QStringLiteral("the end of the game is not announced once and last");
+            return "the end of the game is not announced once and last";
         return {};
     }
 
-    GameBoard& b;
-    const GameRecord& r;
-    std::mt19937 rng;
+    std::mt19937 rng{20240611u};
+    std::unique_ptr<GameBoard> board = MakeBoard();
+    GameBoard& b = *board;
+    const GameRecord& r = b.record;
+    quint64 keyClock = 0;
+    // Of the game under way: whether it has ended, the scores last seen, the
+    // tally at its start.
     bool ended = false;
-    int lastYou = 0;
-    int lastOpponent = 0;
-    int32_t tallyFor = 0;
-    int32_t tallyAgainst = 0;
+    int lastYou = 0, lastOpponent = 0;
+    int32_t tallyFor = 0, tallyAgainst = 0;
 };
-
-} // namespace
-
-// Whole games against the computer, from the first deal to 121, by a user who
-// also taps and presses keys at random. VENNICK_SOAK_GAMES raises the count;
-// the games are played in rounds, one data row each, so that Qt Test's limit
-// per test function applies to a round, not to the whole run.
-class SoakTest : public QObject {
-    Q_OBJECT
-
-private slots:
-    void initTestCase()
-    {
-        board = MakeBoard();
-        user = std::make_unique<ScriptedUser>(*board, 20240611u);
-    }
-    void wholeGames_data();
-    void wholeGames();
-
-private:
-    std::unique_ptr<GameBoard> board;
-    std::unique_ptr<ScriptedUser> user;
-};
-
-void SoakTest::wholeGames_data()
-{
-    QTest::addColumn<int>("games");
-    const int asked = qEnvironmentVariableIntValue("VENNICK_SOAK_GAMES");
-    for (int left = asked > 0 ? asked : 300, round = 1; left > 0; left -= kGamesPerRound, ++round)
-        QTest::addRow("round %d", round) << std::min(left, kGamesPerRound);
-}
 
 void SoakTest::wholeGames()
 {
     QFETCH(int, games);
     for (int finished = 0, actions = 0; finished < games; actions = 0) {
         bool abandoned = false;
-        while (!user->Ended() && !abandoned) {
+        while (!ended && !abandoned) {
             QVERIFY2(++actions < kActionsPerGameLimit, "a game never ends");
-            abandoned = !user->Act();
-            const QString broken = abandoned ? QString() : user->Check();
+            abandoned = !Act();
+            const QString broken = abandoned ? QString() : Check();
             QVERIFY2(broken.isEmpty(), qPrintable(QStringLiteral("game %1, action %2: %3")
                                                       .arg(finished).arg(actions).arg(broken)));
             // Now and then: what the window has painted bit by bit is what a
             // fresh paint of the record shows.
             if (actions % 97 == 0) {
                 QCoreApplication::processEvents();
-                QVERIFY2(board->screen()->grabWindow(board->winId()).toImage() == board->grab().toImage(),
+                QVERIFY2(b.screen()->grabWindow(b.winId()).toImage() == b.grab().toImage(),
                          "the window as painted differs from a fresh paint of it");
             }
         }
         if (!abandoned) {
             // Once over, nothing the user taps or presses changes the board.
-            const QImage over = board->grab().toImage();
+            const QImage over = b.grab().toImage();
             for (int i = 0; i < 6; ++i)
-                user->Nonsense();
-            QVERIFY2(board->grab().toImage() == over, "the board changed after the game");
+                Nonsense();
+            QVERIFY2(b.grab().toImage() == over, "the board changed after the game");
             ++finished;
-            board->NewGame();
+            b.NewGame();
         }
-        user->StartTracking();
-        QCOMPARE(user->Check(), QString());
-        QCOMPARE(LogLines(*board).size(), 3);
+        std::tie(ended, lastYou, lastOpponent, tallyFor, tallyAgainst) = std::tuple(false, 0, 0, r.gamesFor, r.gamesAgainst);
+        QCOMPARE(Check(), QString());
+        QCOMPARE(LogLines(b).size(), 3);
     }
 }
 

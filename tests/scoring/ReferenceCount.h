@@ -7,14 +7,13 @@
 // Positions 0 to 3 are the four cards, 4 the starter.
 inline int ReferenceCountHand(const CardId cards[5], bool cribRule)
 {
-    int points = 0;
+    int points = 0, count[14] = {};  // one beyond the king, always 0, ends the last stretch
     for (int subset = 1; subset < 32; ++subset) {
         int sum = 0;
         for (int i = 0; i < 5; ++i)
             sum += subset & (1 << i) ? CardValue(cards[i]) : 0;
         points += sum == 15 ? 2 : 0;
     }
-    int count[14] = {};  // one beyond the king, always 0, ends the last stretch
     for (int i = 0; i < 5; ++i)
         ++count[CardRank(cards[i])];
     // Two points for each way of choosing two cards of one rank; each stretch
@@ -30,12 +29,12 @@ inline int ReferenceCountHand(const CardId cards[5], bool cribRule)
         }
     }
     int sameSuit = 0;
-    for (int i = 1; i < 4; ++i)
-        sameSuit += CardSuit(cards[i]) == CardSuit(cards[0]) ? 1 : 0;
-    if (sameSuit == 3)
+    for (int i = 0; i < 4; ++i) {
+        sameSuit += CardSuit(cards[i]) == CardSuit(cards[0]);
+        points += CardRank(cards[i]) == 10 && CardSuit(cards[i]) == CardSuit(cards[4]);  // the starter's jack
+    }
+    if (sameSuit == 4)
         points += CardSuit(cards[4]) == CardSuit(cards[0]) ? 5 : cribRule ? 0 : 4;
-    for (int i = 0; i < 4; ++i)
-        points += CardRank(cards[i]) == 10 && CardSuit(cards[i]) == CardSuit(cards[4]) ? 1 : 0;
     return points;
 }
 

@@ -3,16 +3,13 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QSettings>
-#include <QtTest>
 
 #include <memory>
 #include <vector>
 
 void ClearSettings()
 {
-    QSettings settings(QStringLiteral("Quorvan"), QStringLiteral("Vennick"));
-    settings.clear();
-    settings.sync();
+    QSettings(QStringLiteral("Quorvan"), QStringLiteral("Vennick")).clear();  // written as it goes
 }
 
 std::unique_ptr<GameBoard> MakeBoard(int scale, bool keepSettings)
@@ -24,27 +21,23 @@ std::unique_ptr<GameBoard> MakeBoard(int scale, bool keepSettings)
     board->show();
     if (!QTest::qWaitForWindowExposed(board.get()))
         qWarning("game window not exposed");
-    // The first paint does the set-up; make sure it has happened.
-    board->repaint();
+    board->repaint();  // the first paint does the set-up; make sure it has happened
     QCoreApplication::processEvents();
     return board;
 }
 
 void StackDeck(GameBoard& board, std::initializer_list<CardId> cards)
 {
+    // Shared, so that copies of the source draw from one queue.
     auto queue = std::make_shared<std::vector<CardId>>(cards);
-    auto next = std::make_shared<size_t>(0);
-    board.randomSource = [queue, next]() {
-        if (*next < queue->size())
-            return static_cast<int>((*queue)[(*next)++]);
-        return std::rand();
+    board.randomSource = [queue, next = std::make_shared<size_t>(0)]() {
+        return *next < queue->size() ? static_cast<int>((*queue)[(*next)++]) : std::rand();
     };
 }
 
 void TapBoard(GameBoard& board, int x, int y)
 {
-    const int sx = board.record.scaleX > 0 ? board.record.scaleX : 1;
-    const int sy = board.record.scaleY > 0 ? board.record.scaleY : 1;
+    const int sx = std::max(board.record.scaleX, 1), sy = std::max(board.record.scaleY, 1);
     QTest::mouseClick(&board, Qt::LeftButton, Qt::NoModifier, QPoint(x * sx + sx / 2, y * sy + sy / 2));
 }
 
@@ -57,19 +50,8 @@ void TapHand(GameBoard& board, int position)
 void ClickButton(GameBoard& board, int id)
 {
     QPushButton* button = board.ActionButton(id);
-    QVERIFY2(button != nullptr, "no such button");
-    QVERIFY2(!button->isHidden(), "button is hidden");
+    QVERIFY2(button != nullptr && !button->isHidden(), "no such button shown");
     QTest::mouseClick(button, Qt::LeftButton);
-}
-
-void PressKey(GameBoard& board, int key)
-{
-    QTest::keyClick(&board, static_cast<Qt::Key>(key));
-}
-
-void ReleaseEnter(GameBoard& board)
-{
-    QTest::keyClick(&board, Qt::Key_Return);
 }
 
 QList<int> ShownButtons(const GameBoard& board)
@@ -84,9 +66,8 @@ QList<int> ShownButtons(const GameBoard& board)
 QStringList LogLines(const GameBoard& board)
 {
     QStringList lines;
-    if (QListWidget* log = board.MessageLog())
-        for (int i = 0; i < log->count(); ++i)
-            lines.append(log->item(i)->text());
+    for (int i = 0; board.MessageLog() && i < board.MessageLog()->count(); ++i)
+        lines.append(board.MessageLog()->item(i)->text());
     return lines;
 }
 

@@ -3,6 +3,7 @@
 #include "game/GameBoard.h"
 
 #include <QStringList>
+#include <QtTest>
 #include <initializer_list>
 #include <memory>
 
@@ -22,8 +23,8 @@ void StackDeck(GameBoard& board, std::initializer_list<CardId> cards);
 void TapBoard(GameBoard& board, int x, int y);
 void TapHand(GameBoard& board, int position);   // 1..6, the middle of that card
 void ClickButton(GameBoard& board, int id);     // a mouse click on a visible button
-void PressKey(GameBoard& board, int key);       // press and release
-void ReleaseEnter(GameBoard& board);            // Return pressed and released
+inline void PressKey(GameBoard& board, int key) { QTest::keyClick(&board, static_cast<Qt::Key>(key)); }
+inline void ReleaseEnter(GameBoard& board) { PressKey(board, Qt::Key_Return); }
 
 // The ids of the action buttons that are shown.
 QList<int> ShownButtons(const GameBoard& board);

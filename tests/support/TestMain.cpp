@@ -10,19 +10,12 @@
 #include <utility>
 #include <vector>
 
-namespace {
-
-std::vector<std::pair<const char*, std::function<int(int, char**)>>>& Registry()
-{
-    static std::vector<std::pair<const char*, std::function<int(int, char**)>>> registry;
-    return registry;
-}
-
-} // namespace
+// Constant-initialised, so it exists before any test file registers.
+constinit static std::vector<std::pair<const char*, std::function<int(int, char**)>>> registry;
 
 bool RegisterTestClass(const char* name, std::function<int(int, char**)> run)
 {
-    Registry().emplace_back(name, std::move(run));
+    registry.emplace_back(name, std::move(run));
     return true;
 }
 
@@ -46,11 +39,8 @@ int main(int argc, char** argv)
     char noCrashHandler[] = "-nocrashhandler";
     args.push_back(noCrashHandler);
     int failed = 0;
-    for (auto& [name, run] : Registry()) {
-        if (run(static_cast<int>(args.size()), args.data()) != 0) {
+    for (auto& [name, run] : registry)
+        if (run(static_cast<int>(args.size()), args.data()) != 0 && ++failed)
             std::fprintf(stderr, "FAILED: %s\n", name);
-            ++failed;
-        }
-    }
     return failed == 0 ? 0 : 1;
 }
