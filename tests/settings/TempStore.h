@@ -32,14 +32,11 @@ public:
 
     QString Folder() const { return dir.path() + QStringLiteral("/Quorvan"); }
     QString FileName() const { return Folder() + QStringLiteral("/Vennick.conf"); }
-
     void Write(const QByteArray& content) const
     {
-        QDir().mkpath(Folder());
         QFile file(FileName());
-        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate) && file.write(content) == content.size());
+        QVERIFY(QDir().mkpath(Folder()) && file.open(QIODevice::WriteOnly) && file.write(content) == content.size());
     }
-
     QByteArray Content() const
     {
         QFile file(FileName());
@@ -54,11 +51,7 @@ private:
 class Unprivileged {
 public:
     Unprivileged() { active = geteuid() == 0 && setegid(65534) == 0 && seteuid(65534) == 0; }
-    ~Unprivileged()
-    {
-        if (active && seteuid(0) == 0)
-            (void)setegid(0);
-    }
+    ~Unprivileged() { (void)(active && seteuid(0) == 0 && setegid(0) == 0); }
 
 private:
     bool active = false;
@@ -79,15 +72,12 @@ bool RunDialog(const std::function<void()>& trigger, std::function<void(Dialog&)
 {
     bool seen = false;
     QTimer::singleShot(0, qApp, [&seen, action] {
-        auto* dialog = qobject_cast<Dialog*>(QApplication::activeModalWidget());
-        if (!dialog)
-            return;
-        seen = true;
-        QPointer<Dialog> guard(dialog);
-        action(*dialog);
-        QTimer::singleShot(2000, dialog, [guard] {
-            if (guard)
-                guard->reject();
+        QPointer<Dialog> dialog = qobject_cast<Dialog*>(QApplication::activeModalWidget());
+        if ((seen = dialog))
+            action(*dialog);
+        QTimer::singleShot(2000, qApp, [dialog] {
+            if (dialog)
+                dialog->reject();
         });
     });
     trigger();
