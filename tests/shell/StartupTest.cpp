@@ -6,7 +6,7 @@
 
 #include <QScreen>
 
-// The program's start-up, as main runs it: the frame, the first paint, the focus.
+// The program's start-up, as main runs it: the icon, the frame, the first paint, the focus.
 class StartupTest : public QObject {
     Q_OBJECT
 
@@ -14,6 +14,8 @@ private slots:
     void startsAsMainDoes()
     {
         auto* app = qobject_cast<CGameApp*>(QCoreApplication::instance());
+        // The window icon in every size the build draws, for task bars and switchers.
+        QCOMPARE(QApplication::windowIcon().availableSizes(), (QList<QSize>{{16, 16}, {32, 32}, {256, 256}}));
         QVERIFY(app && app->InitInstance());
         CMainFrame* frame = app->MainFrame();
         QVERIFY(frame && QTest::qWaitForWindowActive(frame));
