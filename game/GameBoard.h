@@ -144,7 +144,6 @@ public:
     void SaveSettings();
     void OnOptions();
     void ApplyBoardStyle(int style);
-    bool WriteStore(class QSettings& settings);
     // True while the store lacks values of this run that a save could not
     // write: loading then keeps them rather than going back to older ones.
     bool storeBehind = false;
@@ -166,6 +165,8 @@ protected:
     bool event(QEvent* event) override;
 
 private:
+    // Writes the four values, the tally merged with the store's, under its lock.
+    bool WriteStore(class QSettings& settings);
     void PlaceCountRect();
     void MovePegs(int points, void (GameBoard::*setBack)(int), void (GameBoard::*setFront)(int),
                   const int32_t& frontHole);
