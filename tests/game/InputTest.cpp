@@ -3,9 +3,7 @@
 
 #include <QHelpEvent>
 #include <QKeyEvent>
-#include <QListWidget>
 #include <QMouseEvent>
-#include <QScrollBar>
 #include <QToolTip>
 
 namespace {
@@ -53,60 +51,45 @@ private slots:
         QCOMPARE(Selected(*board), (QList<int>{1, 5}));
     }
 
-    void keysPickPositions_data()
-    {
-        QTest::addColumn<int>("key");
-        QTest::addColumn<int>("position");  // 0: none
-        const std::pair<int, int> rows[] = {{Qt::Key_Up, 1}, {Qt::Key_Left, 2}, {Qt::Key_Right, 3}, {Qt::Key_Down, 6},
-                                            {Qt::Key_0, 0},  {Qt::Key_1, 1},    {Qt::Key_4, 4},     {Qt::Key_6, 6}, {Qt::Key_7, 0}};
-        for (auto [key, position] : rows)
-            QTest::addRow("key %x", key) << key << position;
-    }
-
-    void keysPickPositions()
-    {
-        QFETCH(int, key);
-        QFETCH(int, position);
-        auto board = MakeBoard();
-        ReleaseEnter(*board);
-        const QList<int> picked = position ? QList<int>{position} : QList<int>{};
-        // Pressed again 20 ms after its release, it is a new press.
-        SendKey(*board, QEvent::KeyPress, key, 500);
-        QCOMPARE(Selected(*board), picked);
-        SendKey(*board, QEvent::KeyRelease, key, 580);
-        SendKey(*board, QEvent::KeyPress, key, 600);
-        QCOMPARE(Selected(*board), QList<int>{});
-    }
-
-    // Held down, a key acts once, however its repeats come: flagged, or as a
-    // plain release and press at the same moment.
-    void heldKeys_data()
+    // Each key picks its place; held down, it acts once, however its repeats
+    // come: flagged, or as a plain release and press at the same moment. Enter
+    // and Escape act on the release. Pressed again 20 ms after its release, a
+    // key is a new press.
+    void keys_data()
     {
         QTest::addColumn<int>("key");
         QTest::addColumn<bool>("flagged");
-        for (int key : {int(Qt::Key_3), int(Qt::Key_Return), int(Qt::Key_Escape), int(Qt::Key_Enter)})
+        QTest::addColumn<int>("position");  // the place it picks, 0 none; -1 it presses Deal
+        const std::pair<int, int> rows[] = {{Qt::Key_Up, 1}, {Qt::Key_Left, 2}, {Qt::Key_Right, 3}, {Qt::Key_Down, 6},
+                                            {Qt::Key_0, 0}, {Qt::Key_4, 4}, {Qt::Key_6, 6}, {Qt::Key_7, 0},
+                                            {Qt::Key_Return, -1}, {Qt::Key_Escape, -1}, {Qt::Key_Enter, -1}};
+        for (auto [key, position] : rows)
             for (bool flagged : {true, false})
-                QTest::addRow("%x %d", key, flagged) << key << flagged;
+                QTest::addRow("key %x, %s", key, flagged ? "flagged" : "plain") << key << flagged << position;
     }
 
-    void heldKeys()
+    void keys()
     {
         QFETCH(int, key);
         QFETCH(bool, flagged);
+        QFETCH(int, position);
         auto board = MakeBoard();
-        const bool card = key == Qt::Key_3;
-        if (card)
-            ReleaseEnter(*board);
+        if (position >= 0)
+            PressKey(*board, Qt::Key_Return);
         SendKey(*board, QEvent::KeyPress, key, 1000);
         for (quint64 t = 1600; t < 3500; t += 33) {
             SendKey(*board, QEvent::KeyRelease, key, t, flagged);
             SendKey(*board, QEvent::KeyPress, key, flagged ? t : t + 2, flagged);
         }
         QTest::qWait(60);  // longer than a release waits
-        QCOMPARE(Selected(*board), card ? QList<int>{3} : QList<int>{});
-        QCOMPARE(board->record.phase, card ? int(kPhaseDiscard) : int(kPhaseNoDeal));
+        QCOMPARE(Selected(*board), position > 0 ? QList<int>{position} : QList<int>{});
+        QCOMPARE(board->record.phase, position >= 0 ? int(kPhaseDiscard) : int(kPhaseNoDeal));
         SendKey(*board, QEvent::KeyRelease, key, 3500);
         QTRY_COMPARE(board->record.phase, int(kPhaseDiscard));
+        SendKey(*board, QEvent::KeyPress, key, 3520);
+        SendKey(*board, QEvent::KeyRelease, key, 3600);
+        QTest::qWait(60);
+        QCOMPARE(Selected(*board), QList<int>{});
         QCOMPARE(LogLines(*board).size(), 5);  // one deal only
     }
 
@@ -123,7 +106,7 @@ private slots:
         GameBoard unpainted;  // never shown: no factors, no buttons yet
         QTest::mouseClick(&unpainted, Qt::LeftButton, Qt::NoModifier, QPoint(100, 170));
         PressKey(unpainted, Qt::Key_1);
-        ReleaseEnter(unpainted);
+        PressKey(unpainted, Qt::Key_Return);
         QCOMPARE(unpainted.record.phase, int(kPhaseNoDeal));
     }
 
@@ -144,21 +127,6 @@ private slots:
         board->PegPoints(kSidePlayer, 87, QStringLiteral("."));
         board->PegPoints(kSideOpponent, 92, QStringLiteral("."));
         QCOMPARE(tipAt(corner), you + QStringLiteral(" 87 \u00b7 Opponent 92 \u00b7 Opponent's crib"));
-    }
-
-    // The message log keeps every line in order and shows the newest, selecting none.
-    void messageLog()
-    {
-        auto board = MakeBoard();
-        QStringList lines = LogLines(*board);
-        for (int i = 0; i < 200; ++i)
-            board->LogMessage(lines.emplace_back(QString::number(i)));
-        QCoreApplication::processEvents();
-        QCOMPARE(LogLines(*board), lines);
-        QScrollBar* bar = board->MessageLog()->verticalScrollBar();
-        QVERIFY(bar->maximum() > 0 && bar->value() == bar->maximum());
-        QTest::mouseClick(board->MessageLog()->viewport(), Qt::LeftButton, Qt::NoModifier, QPoint(10, 5));
-        QVERIFY(board->MessageLog()->selectedItems().isEmpty());
     }
 };
 

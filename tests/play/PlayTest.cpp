@@ -218,7 +218,7 @@ void PlayTest::deal()
                 PressKey(b, Qt::Key_0 + p);
             }
             step == "ok" ? ClickButton(b, ShownButtons(b).value(0)) : step.startsWith("you=") ? b.MovePlayerPegs(n)
-                : step.startsWith("opp=") ? b.MoveOpponentPegs(n) : ReleaseEnter(b);
+                : step.startsWith("opp=") ? b.MoveOpponentPegs(n) : PressKey(b, Qt::Key_Return);
             continue;
         }
         const int place = static_cast<int>(std::find(r.deal + 1, r.deal + 5, CardNamed(step.right(2))) - r.deal) + 1;

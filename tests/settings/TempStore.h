@@ -3,19 +3,15 @@
 #include "presentation/ImageHolder.h"
 #include "support/TestBoard.h"
 
-#include <QApplication>
 #include <QDir>
 #include <QFile>
-#include <QPointer>
 #include <QSettings>
 #include <QTemporaryDir>
-#include <QTimer>
 #include <QtTest>
 
-#include <functional>
 #include <unistd.h>
 
-// Helpers of the settings tests; the shell's tests work their dialogs with RunDialog too.
+// Helpers of the tests that read and write the stored settings.
 
 // The settings store of a test: a fresh user-scope folder while it lives, so no
 // two cases share a file (or the settings cache's copy of it).
@@ -63,23 +59,4 @@ inline bool HoldsBoard(const GameBoard& board, int style)
     const int id = style == 1 ? kBitmapBoardNormal : style == 2 ? kBitmapBoardWooden : kBitmapBoardEmbossed;
     const QImage expected = QImage(BitmapResourcePath(id)).convertToFormat(QImage::Format_RGB32);
     return !expected.isNull() && board.boardBitmap.Image().convertToFormat(QImage::Format_RGB32) == expected;
-}
-
-// Triggers a command while action works the modal dialog it opens; says whether
-// one was seen. A dialog left open is rejected so that a fault cannot hang the run.
-template <class Dialog>
-bool RunDialog(const std::function<void()>& trigger, std::function<void(Dialog&)> action)
-{
-    bool seen = false;
-    QTimer::singleShot(0, qApp, [&seen, action] {
-        QPointer<Dialog> dialog = qobject_cast<Dialog*>(QApplication::activeModalWidget());
-        if ((seen = dialog))
-            action(*dialog);
-        QTimer::singleShot(2000, qApp, [dialog] {
-            if (dialog)
-                dialog->reject();
-        });
-    });
-    trigger();
-    return seen;
 }

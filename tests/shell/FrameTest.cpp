@@ -1,9 +1,6 @@
+#include "game/GameBoard.h"
 #include "shell/MainFrame.h"
-#include "support/TestBoard.h"
 #include "support/TestMain.h"
-
-#include <QListWidget>
-#include <QScreen>
 
 // The frame's size: the largest whole factor in device pixels that fits the screen.
 class FrameTest : public QObject {
@@ -38,24 +35,6 @@ private slots:
         const QSize device = (QSizeF(window) * ratio).toSize();
         QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), GameBoard::ScaleFactorY(device.height())), QSize(scale, scale));
         QVERIFY(scale == 1 || available.expandedTo(window + chrome) == available);
-    }
-
-    void frameHoldsTheGameWindow()
-    {
-        ClearSettings();
-        CMainFrame frame;
-        frame.show();
-        QVERIFY(QTest::qWaitForWindowExposed(&frame));
-        QCOMPARE(frame.windowTitle(), QStringLiteral("Vennick"));
-        QCOMPARE(frame.centralWidget(), frame.Board());
-        GameBoard& board = *frame.Board();
-        board.repaint();
-        QCOMPARE(board.size(), frame.GameWindowSize(board.record.scaleY, 1.0));
-        QCOMPARE(frame.minimumSize(), frame.maximumSize());
-        // The whole log is inside the game window, the frame inside the screen.
-        QVERIFY(board.rect().contains(board.MessageLog()->geometry()));
-        const QSize available = frame.screen()->availableGeometry().size();
-        QCOMPARE(available.expandedTo(frame.frameGeometry().size()), available);
     }
 };
 

@@ -1,5 +1,5 @@
+#include "settings/OptionsDialog.h"
 #include "settings/TempStore.h"
-#include "shell/AboutDialog.h"
 #include "shell/MainFrame.h"
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
@@ -9,17 +9,22 @@
 #include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
+#include <QPointer>
 #include <QPushButton>
+#include <QRadioButton>
+#include <QTimer>
 #include <QToolTip>
 
+#include <functional>
 #include <memory>
 
 namespace {
 
 // A frame shown and active, as the user sees it, on a cleared store.
-std::unique_ptr<CMainFrame> MakeFrame()
+std::unique_ptr<CMainFrame> MakeFrame(bool keepSettings = false)
 {
-    ClearSettings();
+    if (!keepSettings)
+        ClearSettings();
     auto frame = std::make_unique<CMainFrame>();
     frame->show();
     frame->activateWindow();
@@ -27,6 +32,24 @@ std::unique_ptr<CMainFrame> MakeFrame()
         qWarning("frame not active");
     frame->Board()->repaint();
     return frame;
+}
+
+// Triggers a command while action works the modal dialog it opens; says whether
+// one was seen. A dialog left open is rejected so that a fault cannot hang the run.
+bool RunDialog(const std::function<void()>& trigger, const std::function<void(QDialog&)>& action)
+{
+    bool seen = false;
+    QTimer::singleShot(0, qApp, [&seen, action] {
+        QPointer<QDialog> dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+        if ((seen = dialog))
+            action(*dialog);
+        QTimer::singleShot(2000, qApp, [dialog] {
+            if (dialog)
+                dialog->reject();
+        });
+    });
+    trigger();
+    return seen;
 }
 
 QStringList Texts(const QList<QAction*>& actions)
@@ -44,7 +67,9 @@ class MenuKeysTest : public QObject {
     Q_OBJECT
 
 private slots:
-    void menuBar()
+    // The menu bar as shown, the tooltip of New; New by its key or on the
+    // menu bar ends the game, and a game won counts.
+    void menuBarAndNew()
     {
         auto frame = MakeFrame();
         QMenuBar* bar = frame->menuBar();
@@ -54,31 +79,20 @@ private slots:
         QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
         QCoreApplication::sendEvent(bar, &help);
         QVERIFY(QToolTip::isVisible() && QToolTip::text().contains(QStringLiteral("Ctrl+N")));
-    }
 
-    // New, by its key or on the menu bar, ends the game; a game won counts.
-    void newGame_data()
-    {
-        QTest::addColumn<bool>("byKey");  // else on the menu bar, the game won
-        QTest::newRow("Ctrl+N while discarding") << true;
-        QTest::newRow("menu bar, game won") << false;
-    }
-
-    void newGame()
-    {
-        QFETCH(bool, byKey);
-        auto frame = MakeFrame();
         GameBoard& board = *frame->Board();
-        ClickButton(board, kCmdDeal);
-        TapHand(board, 1);
-        if (byKey) {
-            QTest::keyClick(frame.get(), Qt::Key_N, Qt::ControlModifier);
-        } else {
-            board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
-            QTest::mouseClick(frame->menuBar(), Qt::LeftButton, {}, frame->menuBar()->actionGeometry(frame->NewAction()).center());
+        for (bool byKey : {true, false}) {
+            ClickButton(board, kCmdDeal);
+            TapHand(board, 1);
+            if (byKey) {
+                QTest::keyClick(frame.get(), Qt::Key_N, Qt::ControlModifier);
+            } else {
+                board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
+                QTest::mouseClick(bar, Qt::LeftButton, {}, onNew);
+            }
+            QCOMPARE(board.record.phase, int(kPhaseNoDeal));
+            QCOMPARE(LogLines(board).first(), board.record.ownerName + (byKey ? ": 0" : ": 4"));  // far ahead: 4
         }
-        QCOMPARE(board.record.phase, int(kPhaseNoDeal));
-        QCOMPARE(LogLines(board).first(), board.record.ownerName + (byKey ? ": 0" : ": 4"));  // far ahead: 4
     }
 
     void ctrlQEndsTheProgram()
@@ -90,43 +104,103 @@ private slots:
         QCOMPARE(QCoreApplication::exec(), 0);
     }
 
-    // The key that closes a dialog, and a key held while one opens, never act
-    // on the game; after it the keyboard reaches the game again.
-    void keysAroundDialogs_data()
+    // The dialogs of the Tools menu during a game. The key that closes one,
+    // and a key held while one opens, never act on the game; Options opens on
+    // the stored style, its arrow keys wrap round the three, and only OK or
+    // Enter sets and saves the style.
+    void dialogs_data()
     {
-        QTest::addColumn<int>("item");  // position in the Tools menu
-        QTest::addColumn<int>("key");   // closes the dialog; 0: the mouse does, Enter being held
-        for (int item : {0, 1})
-            for (int key : {int(Qt::Key_Return), int(Qt::Key_Escape), 0})
-                QTest::addRow("%s %x", item ? "Options" : "About", key) << item << key;
+        QTest::addColumn<int>("item");      // in the Tools menu: About 0, Options 1
+        QTest::addColumn<int>("stored");    // the style in the store
+        QTest::addColumn<QString>("keys");  // a digit clicks that style; d, u: arrow down, up
+        QTest::addColumn<int>("end");       // Enter, Escape, or a click on OK or Cancel with Enter held
+        QTest::addColumn<int>("style");     // the style afterwards
+        const int ok = QDialogButtonBox::Ok, cancel = QDialogButtonBox::Cancel, enter = Qt::Key_Return, escape = Qt::Key_Escape;
+        QTest::newRow("About, Enter") << 0 << 2 << "" << enter << 2;
+        QTest::newRow("About, Escape") << 0 << 2 << "" << escape << 2;
+        QTest::newRow("About, OK") << 0 << 2 << "" << ok << 2;
+        QTest::newRow("Wooden; Embossed, OK") << 1 << 2 << "3" << ok << 3;
+        QTest::newRow("Embossed; Normal, Wooden, OK") << 1 << 3 << "12" << ok << 2;
+        QTest::newRow("Wooden; Embossed, Cancel") << 1 << 2 << "3" << cancel << 2;
+        QTest::newRow("Wooden; Embossed, Escape") << 1 << 2 << "3" << escape << 2;
+        QTest::newRow("Wooden; down, Enter") << 1 << 2 << "d" << enter << 3;
+        QTest::newRow("Embossed; up, up, Enter") << 1 << 3 << "uu" << enter << 1;
+        QTest::newRow("Embossed; down round to Normal, Enter") << 1 << 3 << "d" << enter << 1;
+        // A damaged style selects no button; confirmed untouched, it is kept.
+        QTest::newRow("7; Enter keeps it") << 1 << 7 << "" << enter << 7;
+        QTest::newRow("0; Normal, OK") << 1 << 0 << "1" << ok << 1;
     }
 
-    void keysAroundDialogs()
+    void dialogs()
     {
         QFETCH(int, item);
-        QFETCH(int, key);
-        auto frame = MakeFrame();
+        QFETCH(int, stored);
+        QFETCH(QString, keys);
+        QFETCH(int, end);
+        QFETCH(int, style);
+        TempStore store;
+        store.Write(QStringLiteral("[General]\nBoard=%1\n").arg(stored).toUtf8());
+        auto frame = MakeFrame(true);
         GameBoard& board = *frame->Board();
         ClickButton(board, kCmdDeal);
         TapHand(board, 1);
         TapHand(board, 2);  // "Send To Crib" is shown: a leaked key would press it
         const QStringList lines = LogLines(board);
-        if (key == 0)
+        // Changed behind the game's back, the store tells whether it is saved.
+        QSettings(QStringLiteral("Quorvan"), QStringLiteral("Vennick")).setValue(QStringLiteral("Board"), 9);
+        const bool byKey = end == Qt::Key_Return || end == Qt::Key_Escape;
+        if (!byKey)
             QTest::keyPress(&board, Qt::Key_Return);
-        QStringList texts;
-        QVERIFY(RunDialog<QDialog>([&] { frame->ToolsMenu()->actions().at(item)->trigger(); }, [&](QDialog& dialog) {
-            texts = {dialog.windowTitle()};
-            for (const QLabel* label : dialog.findChildren<QLabel*>())
-                texts.append(label->pixmap().isNull() ? label->text() : QString::number(label->pixmap().width()));
-            if (key != 0)
-                QTest::keyPress(&dialog, static_cast<Qt::Key>(key));
+
+        // The title and the labels, then per step the style selected and the one with the focus.
+        QStringList shown;
+        QVERIFY(RunDialog([&] { frame->ToolsMenu()->actions().at(item)->trigger(); }, [&](QDialog& dialog) {
+            shown = {dialog.windowTitle()};
+            // Each label, and whether it lies right of the one before and above the buttons.
+            QRect before;
+            for (const QLabel* label : dialog.findChildren<QLabel*>()) {
+                const QRect at = label->geometry();
+                const bool placed = at.left() > before.right() && at.bottom() < dialog.findChild<QDialogButtonBox*>()->y();
+                shown.append((label->pixmap().isNull() ? label->text() : QString::number(label->pixmap().width()))
+                             + (placed ? "" : " misplaced"));
+                before = at;
+            }
+            auto* options = qobject_cast<COptionsDlg*>(&dialog);
+            for (int s = 1; options && s <= 3; ++s)
+                shown.append(options->StyleButton(kStyleButtonNormal + s - 1)->text());
+            for (const QChar k : QStringLiteral("-") + keys) {
+                if (!options)
+                    break;
+                if (k.isDigit())
+                    QTest::mouseClick(options->StyleButton(kStyleButtonNormal + k.digitValue() - 1), Qt::LeftButton);
+                else if (k != u'-')
+                    QTest::keyClick(dialog.focusWidget(), k == u'd' ? Qt::Key_Down : Qt::Key_Up);
+                QString state = QStringLiteral("-");
+                for (int s = 1; s <= 3; ++s) {
+                    const QRadioButton* button = options->StyleButton(kStyleButtonNormal + s - 1);
+                    state += (button->isChecked() ? QString::number(s) : QString()) + (dialog.focusWidget() == button ? "f" : "");
+                }
+                shown.append(state);
+            }
+            if (byKey)
+                QTest::keyPress(dialog.focusWidget() ? dialog.focusWidget() : &dialog, Qt::Key(end));
             else
-                QTest::mouseClick(dialog.findChild<QDialogButtonBox*>()->buttons().first(), Qt::LeftButton);
+                QTest::mouseClick(dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::StandardButton(end)), Qt::LeftButton);
         }));
-        QTest::keyRelease(&board, key ? static_cast<Qt::Key>(key) : Qt::Key_Return);
+        QTest::keyRelease(&board, byKey ? Qt::Key(end) : Qt::Key_Return);
         QTest::qWait(60);
+        const bool confirmed = item == 1 && (end == QDialogButtonBox::Ok || end == Qt::Key_Return);
         if (item == 0)
-            QCOMPARE(texts, (QStringList{"About Vennick", "32", "Vennick"}));
+            QCOMPARE(shown, (QStringList{"About Vennick", "32", "Vennick"}));
+        else
+            QCOMPARE(shown.mid(0, 5), (QStringList{"Options", "Normal", "Wooden", "Embossed",
+                                                   stored >= 1 && stored <= 3 ? QStringLiteral("-%1f").arg(stored) : "-"}));
+        if (!keys.isEmpty())
+            QCOMPARE(shown.last().left(2), QStringLiteral("-%1").arg(confirmed ? style : keys.back().digitValue()));
+        QCOMPARE(board.record.boardStyle, style);
+        QCOMPARE(QSettings(QStringLiteral("Quorvan"), QStringLiteral("Vennick")).value(QStringLiteral("Board")).toInt(),
+                 confirmed ? style : 9);
+        QVERIFY(HoldsBoard(board, style));
         QCOMPARE(board.record.phase, int(kPhaseDiscard));
         QCOMPARE(LogLines(board), lines);
         frame->activateWindow();  // what a window manager does as a dialog closes

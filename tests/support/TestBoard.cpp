@@ -71,11 +71,27 @@ QStringList LogLines(const GameBoard& board)
     return lines;
 }
 
+namespace {
+const QString kRanks = QStringLiteral("A23456789TJQK");
+const QString kSuits = QStringLiteral("SDHC");
+} // namespace
+
 CardId CardNamed(const QString& name)
 {
-    const auto rank1 = QStringLiteral("A23456789TJQK").indexOf(name.left(1)) + 1;
-    const auto suit1 = QStringLiteral("SDHC").indexOf(name.mid(1)) + 1;
+    const auto rank1 = kRanks.indexOf(name.left(1)) + 1;
+    const auto suit1 = kSuits.indexOf(name.mid(1)) + 1;
     if (name.size() != 2 || rank1 == 0 || suit1 == 0)
         qFatal("no such card: %s", qPrintable(name));
     return Card(static_cast<int>(rank1), static_cast<int>(suit1));
+}
+
+QString CardName(CardId card) { return kRanks.mid(CardRank(card), 1) + kSuits.mid(CardSuit(card), 1); }
+
+QString ShownCards(std::span<const CardSprite> places)
+{
+    QStringList names;
+    for (const CardSprite& s : places)
+        names.append(s.suit1 == kSuitEmpty ? "--" : s.suit1 == kSuitBack || s.faceDown ? "##"
+                                                   : CardName(Card(s.rank1, s.suit1)));
+    return names.join(' ');
 }
