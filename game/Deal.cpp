@@ -16,14 +16,10 @@ void GameBoard::DealHand()
     GameRecord& r = record;
     // Thirteen distinct cards: a card already dealt is simply drawn again.
     for (int k = 0; k < 13; ++k) {
-        CardId n = 0;
-        bool repeated = true;
-        while (repeated) {
+        CardId n;
+        do
             n = randomSource() % 52;
-            repeated = false;
-            for (int i = 0; i < k; ++i)
-                repeated = repeated || r.deal[i] == n;
-        }
+        while (std::find(r.deal, r.deal + k, n) != r.deal + k);
         r.deal[k] = n;
     }
     for (int& flag : r.selected)

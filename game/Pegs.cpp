@@ -8,7 +8,7 @@ void SetHole(int32_t& peg, int hole, const GameRecord& r)
     for (const int32_t* other : {&r.playerBackHole, &r.playerFrontHole, &r.opponentBackHole, &r.opponentFrontHole})
         if (other != &peg && *other == kGameHole)
             return;
-    peg = hole > kGameHole ? kGameHole : hole;
+    peg = std::min(hole, kGameHole);
 }
 
 } // namespace

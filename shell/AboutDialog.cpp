@@ -29,6 +29,5 @@ CAboutDlg::CAboutDlg(QWidget* parent)
     layout->addWidget(iconLabel, 0, 0, Qt::AlignTop);
     layout->addWidget(nameLabel, 0, 1, Qt::AlignTop | Qt::AlignLeft);
     layout->addWidget(buttons, 1, 0, 1, 2);
-    layout->setColumnStretch(1, 1);
     layout->setSizeConstraint(QLayout::SetFixedSize);
 }
