@@ -1,5 +1,6 @@
 #include "settings/OptionsDialog.h"
 #include "settings/TempStore.h"
+#include "shell/GameApp.h"
 #include "shell/MainFrame.h"
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
@@ -7,11 +8,13 @@
 #include <QDialogButtonBox>
 #include <QHelpEvent>
 #include <QLabel>
+#include <QListWidget>
 #include <QMenu>
 #include <QMenuBar>
 #include <QPointer>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScreen>
 #include <QTimer>
 #include <QToolTip>
 
@@ -62,11 +65,68 @@ QStringList Texts(const QList<QAction*>& actions)
 
 } // namespace
 
-// The menu bar, the keys of the frame and the keys that close a dialog.
-class MenuKeysTest : public QObject {
+// The program as main starts it, the frame's size, its menu bar and keys, and
+// the dialogs it opens.
+class ShellTest : public QObject {
     Q_OBJECT
 
 private slots:
+    // The program's start-up, as main runs it: the icon, the frame, the first paint, the focus.
+    void startsAsMainDoes()
+    {
+        auto* app = qobject_cast<CGameApp*>(QCoreApplication::instance());
+        // The window icon in every size the build draws, for task bars and switchers.
+        QCOMPARE(QApplication::windowIcon().availableSizes(), (QList<QSize>{{16, 16}, {32, 32}, {256, 256}}));
+        QVERIFY(app && app->InitInstance());
+        CMainFrame* frame = app->MainFrame();
+        QVERIFY(frame && QTest::qWaitForWindowActive(frame));
+        GameBoard* board = frame->Board();
+        QTRY_COMPARE(board->record.firstPaintPending, 0);
+        QCOMPARE(ShownButtons(*board), QList<int>{kCmdDeal});
+        QCOMPARE(LogLines(*board).mid(2), QStringList{"Click Deal to start a new game."});  // the third of three
+        QTRY_COMPARE(QApplication::focusWidget(), static_cast<QWidget*>(board));
+        // The game window fills the frame at its chosen factor, the log inside it, the frame inside the screen.
+        QCOMPARE(frame->windowTitle(), QStringLiteral("Vennick"));
+        QCOMPARE(frame->centralWidget(), board);
+        QCOMPARE(board->size(), frame->GameWindowSize(board->record.scaleY, 1.0));
+        QCOMPARE(frame->minimumSize(), frame->maximumSize());
+        QVERIFY(board->rect().contains(board->MessageLog()->geometry()));
+        QVERIFY(frame->screen()->availableGeometry().contains(frame->frameGeometry()));
+        frame->hide();  // out of the way of the suites that run after this one
+    }
+
+    // The frame's size: the largest whole factor in device pixels that fits the screen.
+    void chooseScale_data()
+    {
+        QTest::addColumn<QSize>("available");
+        QTest::addColumn<double>("ratio");
+        QTest::addColumn<int>("scale");
+        QTest::newRow("800 x 600") << QSize(800, 600) << 1.0 << 1;
+        QTest::newRow("1920 x 1080 is limited by height") << QSize(1920, 1080) << 1.0 << 3;
+        QTest::newRow("exactly scale 2") << QSize(496, 658) << 1.0 << 2;
+        QTest::newRow("one pixel short of scale 2") << QSize(496, 657) << 1.0 << 1;
+        QTest::newRow("1024 x 768 at 150%") << QSize(683, 512) << 1.5 << 2;
+        QTest::newRow("1920 x 1080 at 125%") << QSize(1536, 864) << 1.25 << 3;
+        QTest::newRow("tiny screen still 1") << QSize(200, 150) << 1.0 << 1;
+    }
+
+    // The game window asked for yields exactly the factor, and fits with the
+    // chrome unless the factor is the least.
+    void chooseScale()
+    {
+        QFETCH(QSize, available);
+        QFETCH(double, ratio);
+        QFETCH(int, scale);
+        const QSize chrome(16, 70);
+        CMainFrame frame;
+        QCOMPARE(frame.ChooseScale(available, chrome, ratio), scale);
+        const QSize window = frame.GameWindowSize(scale, ratio);
+        const QSize device = (QSizeF(window) * ratio).toSize();
+        QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), GameBoard::ScaleFactorY(device.height())), QSize(scale, scale));
+        QVERIFY(scale == 1 || available.expandedTo(window + chrome) == available);
+    }
+
+    // The menu bar, the keys of the frame and the keys that close a dialog.
     // The menu bar as shown, the tooltip of New; New by its key or on the
     // menu bar ends the game, and a game won counts.
     void menuBarAndNew()
@@ -210,5 +270,5 @@ private slots:
     }
 };
 
-VENNICK_TEST(MenuKeysTest);
-#include "MenuKeysTest.moc"
+VENNICK_TEST(ShellTest);
+#include "ShellTest.moc"
