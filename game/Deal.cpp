@@ -3,6 +3,7 @@
 #include <QListWidget>
 #include <QPushButton>
 
+#include <algorithm>
 #include <utility>
 
 void GameBoard::OnDeal()

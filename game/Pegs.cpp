@@ -1,5 +1,7 @@
 #include "game/GameBoard.h"
 
+#include <algorithm>
+
 namespace {
 
 // A peg moves only while no peg stands in the game hole; it never passes it.
