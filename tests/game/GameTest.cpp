@@ -138,7 +138,10 @@ private slots:
         SendKey(*board, QEvent::KeyPress, Qt::Key_Return, 100);
         SendKey(*board, QEvent::KeyRelease, Qt::Key_Return, 200);
         SendKey(*board, QEvent::KeyPress, Qt::Key_2, 201);
-        QCOMPARE(Selected(*board), QList<int>{2});
+        SendKey(*board, QEvent::KeyPress, Qt::Key_5, 202);
+        QTest::qWait(100);  // the Enter has acted once: Send To Crib waits
+        QCOMPARE(Selected(*board), (QList<int>{2, 5}));
+        QCOMPARE(ShownButtons(*board), QList<int>{kCmdSendToCrib});
 
         GameBoard unpainted;  // never shown: no factors, no buttons yet
         QTest::mouseClick(&unpainted, Qt::LeftButton, Qt::NoModifier, QPoint(100, 170));
