@@ -56,9 +56,11 @@ void CheckScreen(GameBoard& board, int boardId)
     expected.fill(qRgb(0, 128, 0));
     QPainter scene(&expected);
     scene.drawImage(0, 0, Art(boardId));
-    const Rect pegs[] = {r.opponentBackPegRect, r.opponentFrontPegRect, r.playerBackPegRect, r.playerFrontPegRect};
+    // Each peg (5 x 5) centred on its hole.
+    const HolePoint pegs[] = {r.opponentHoles[r.opponentBackHole], r.opponentHoles[r.opponentFrontHole],
+                              r.playerHoles[r.playerBackHole], r.playerHoles[r.playerFrontHole]};
     for (int i = 0; i < 4; ++i)
-        scene.drawImage(pegs[i].left, pegs[i].top, Art(i < 2 ? kBitmapOpponentPeg : kBitmapPlayerPeg));
+        scene.drawImage(pegs[i].x - 2, pegs[i].y - 2, Art(i < 2 ? kBitmapOpponentPeg : kBitmapPlayerPeg));
     using Places = std::span<const CardSprite>;
     for (Places group : {Places(r.opponentHandSprites), Places(r.playerHandSprites), Places(r.opponentPileSprites),
                          Places(r.playerPileSprites), Places(&r.starterSprite, 1)})
