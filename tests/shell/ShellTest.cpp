@@ -188,7 +188,7 @@ private slots:
         QTest::newRow("Wooden; Embossed, Escape") << 1 << 2 << "3" << escape << options + "2f 3f > 2";
         QTest::newRow("Wooden; down, Enter") << 1 << 2 << "d" << enter << options + "2f 3f > 3 saved";
         QTest::newRow("Embossed; up, up, Enter") << 1 << 3 << "uu" << enter << options + "3f 2f 1f > 1 saved";
-        QTest::newRow("Embossed; down round to Normal, Enter") << 1 << 3 << "d" << enter << options + "3f 1f > 1 saved";
+        QTest::newRow("Embossed; down round to Normal, up round back, Enter") << 1 << 3 << "du" << enter << options + "3f 1f 3f > 3 saved";
         // A damaged style selects no button; confirmed untouched, it is kept.
         QTest::newRow("7; Enter keeps it") << 1 << 7 << "" << enter << options + " > 7 saved";
         QTest::newRow("0; Normal, OK") << 1 << 0 << "1" << ok << options + " 1f > 1 saved";
