@@ -7,6 +7,7 @@
 #include <QSysInfo>
 
 #include <optional>
+#include <pwd.h>
 #include <random>
 #include <sys/stat.h>
 
@@ -32,6 +33,9 @@ private slots:
         QCOMPARE(OwnerNameFromGecos("  Ada Byron \t,Room 12,555-1234,"), QStringLiteral("Ada Byron"));
         QCOMPARE(OwnerNameFromGecos("Zo\xc3\xab Ng"), QStringLiteral("Zo\u00eb Ng"));
         QCOMPARE(OwnerNameFromGecos(",Room 12"), QStringLiteral("You"));
+        // The account's own name, looked up here the simple way.
+        const passwd* account = getpwuid(getuid());
+        QCOMPARE(SystemOwnerName(), OwnerNameFromGecos(account && account->pw_gecos ? account->pw_gecos : ""));
     }
 
     // A store that is missing or empty is created with the defaults; any other
