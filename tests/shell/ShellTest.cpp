@@ -23,20 +23,6 @@
 
 namespace {
 
-// A frame shown and active, as the user sees it, on a cleared store.
-std::unique_ptr<CMainFrame> MakeFrame(bool keepSettings = false)
-{
-    if (!keepSettings)
-        ClearSettings();
-    auto frame = std::make_unique<CMainFrame>();
-    frame->show();
-    frame->activateWindow();
-    if (!QTest::qWaitForWindowActive(frame.get()))
-        qWarning("frame not active");
-    frame->Board()->repaint();
-    return frame;
-}
-
 // Triggers a command while action works the modal dialog it opens; says whether
 // one was seen. A dialog left open is rejected so that a fault cannot hang the run.
 bool RunDialog(const std::function<void()>& trigger, const std::function<void(QDialog&)>& action)
@@ -55,14 +41,6 @@ bool RunDialog(const std::function<void()>& trigger, const std::function<void(QD
     return seen;
 }
 
-QStringList Texts(const QList<QAction*>& actions)
-{
-    QStringList texts;
-    for (const QAction* action : actions)
-        texts.append(action->text() + action->shortcut().toString());
-    return texts;
-}
-
 } // namespace
 
 // The program as main starts it, the frame's size, its menu bar and keys, and
@@ -71,28 +49,57 @@ class ShellTest : public QObject {
     Q_OBJECT
 
 private slots:
-    // The program's start-up, as main runs it: the icon, the frame, the first paint, the focus.
+    // The program as main starts it: the icon, the frame, the first paint,
+    // the focus; then its menu bar, New by key and on the bar, and Ctrl+Q.
     void startsAsMainDoes()
     {
+        ClearSettings();
         auto* app = qobject_cast<CGameApp*>(QCoreApplication::instance());
         // The window icon in every size the build draws, for task bars and switchers.
         QCOMPARE(QApplication::windowIcon().availableSizes(), (QList<QSize>{{16, 16}, {32, 32}, {256, 256}}));
         QVERIFY(app && app->InitInstance());
         CMainFrame* frame = app->MainFrame();
         QVERIFY(frame && QTest::qWaitForWindowActive(frame));
-        GameBoard* board = frame->Board();
-        QTRY_COMPARE(board->record.firstPaintPending, 0);
-        QCOMPARE(ShownButtons(*board), QList<int>{kCmdDeal});
-        QCOMPARE(LogLines(*board).mid(2), QStringList{"Click Deal to start a new game."});  // the third of three
-        QTRY_COMPARE(QApplication::focusWidget(), static_cast<QWidget*>(board));
+        GameBoard& board = *frame->Board();
+        QTRY_COMPARE(board.record.firstPaintPending, 0);
+        QCOMPARE(ShownButtons(board), QList<int>{kCmdDeal});
+        QCOMPARE(LogLines(board).mid(2), QStringList{"Click Deal to start a new game."});  // the third of three
+        QTRY_COMPARE(QApplication::focusWidget(), static_cast<QWidget*>(&board));
         // The game window fills the frame at its chosen factor, the log inside it, the frame inside the screen.
         QCOMPARE(frame->windowTitle(), QStringLiteral("Vennick"));
-        QCOMPARE(frame->centralWidget(), board);
-        QCOMPARE(board->size(), frame->GameWindowSize(board->record.scaleY, 1.0));
+        QCOMPARE(frame->centralWidget(), &board);
+        QCOMPARE(board.size(), frame->GameWindowSize(board.record.scaleY, 1.0));
         QCOMPARE(frame->minimumSize(), frame->maximumSize());
-        QVERIFY(board->rect().contains(board->MessageLog()->geometry()));
+        QVERIFY(board.rect().contains(board.MessageLog()->geometry()));
         QVERIFY(frame->screen()->availableGeometry().contains(frame->frameGeometry()));
-        frame->hide();  // out of the way of the suites that run after this one
+
+        QMenuBar* bar = frame->menuBar();
+        QStringList texts;
+        for (const QAction* action : bar->actions() + frame->ToolsMenu()->actions())
+            texts.append(action->text() + action->shortcut().toString());
+        QCOMPARE(texts, (QStringList{"NewCtrl+N", "Tools", "About Vennick...", "Options...", "ExitCtrl+Q"}));
+        const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
+        QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
+        QCoreApplication::sendEvent(bar, &help);
+        QVERIFY(QToolTip::isVisible() && QToolTip::text().contains(QStringLiteral("Ctrl+N")));
+        // New ends the game; a game won from far ahead counts 4.
+        for (bool byKey : {true, false}) {
+            ClickButton(board, kCmdDeal);
+            TapHand(board, 1);
+            if (byKey) {
+                QTest::keyClick(frame, Qt::Key_N, Qt::ControlModifier);
+            } else {
+                board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
+                QTest::mouseClick(bar, Qt::LeftButton, {}, onNew);
+            }
+            QCOMPARE(board.record.phase, int(kPhaseNoDeal));
+            QCOMPARE(LogLines(board).first(), board.record.ownerName + (byKey ? ": 0" : ": 4"));
+        }
+        // Ctrl+Q ends the program's own loop; 7 should nothing end it within five seconds.
+        QTimer::singleShot(0, frame, [frame] { QTest::keyClick(frame, Qt::Key_Q, Qt::ControlModifier); });
+        QTimer::singleShot(5000, frame, [] { QCoreApplication::exit(7); });
+        QCOMPARE(QCoreApplication::exec(), 0);
+        frame->hide();  // out of the way of the tests that follow
     }
 
     // The frame's size: the largest whole factor in device pixels that fits the screen.
@@ -124,44 +131,6 @@ private slots:
         const QSize device = (QSizeF(window) * ratio).toSize();
         QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), GameBoard::ScaleFactorY(device.height())), QSize(scale, scale));
         QVERIFY(scale == 1 || available.expandedTo(window + chrome) == available);
-    }
-
-    // The menu bar, the keys of the frame and the keys that close a dialog.
-    // The menu bar as shown, the tooltip of New; New by its key or on the
-    // menu bar ends the game, and a game won counts.
-    void menuBarAndNew()
-    {
-        auto frame = MakeFrame();
-        QMenuBar* bar = frame->menuBar();
-        QCOMPARE(Texts(bar->actions() + frame->ToolsMenu()->actions()),
-                 (QStringList{"NewCtrl+N", "Tools", "About Vennick...", "Options...", "ExitCtrl+Q"}));
-        const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
-        QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
-        QCoreApplication::sendEvent(bar, &help);
-        QVERIFY(QToolTip::isVisible() && QToolTip::text().contains(QStringLiteral("Ctrl+N")));
-
-        GameBoard& board = *frame->Board();
-        for (bool byKey : {true, false}) {
-            ClickButton(board, kCmdDeal);
-            TapHand(board, 1);
-            if (byKey) {
-                QTest::keyClick(frame.get(), Qt::Key_N, Qt::ControlModifier);
-            } else {
-                board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
-                QTest::mouseClick(bar, Qt::LeftButton, {}, onNew);
-            }
-            QCOMPARE(board.record.phase, int(kPhaseNoDeal));
-            QCOMPARE(LogLines(board).first(), board.record.ownerName + (byKey ? ": 0" : ": 4"));  // far ahead: 4
-        }
-    }
-
-    void ctrlQEndsTheProgram()
-    {
-        auto frame = MakeFrame();
-        // The program's own loop; 7 should nothing end it within five seconds.
-        QTimer::singleShot(0, frame.get(), [&frame] { QTest::keyClick(frame.get(), Qt::Key_Q, Qt::ControlModifier); });
-        QTimer::singleShot(5000, frame.get(), [] { QCoreApplication::exit(7); });
-        QCOMPARE(QCoreApplication::exec(), 0);
     }
 
     // The dialogs of the Tools menu during a game. The key that closes one,
@@ -203,7 +172,9 @@ private slots:
         QFETCH(QString, expected);
         TempStore store;
         store.Write(QStringLiteral("[General]\nBoard=%1\n").arg(stored).toUtf8());
-        auto frame = MakeFrame(true);
+        auto frame = std::make_unique<CMainFrame>();
+        frame->show();
+        QVERIFY(QTest::qWaitForWindowActive(frame.get()));
         GameBoard& board = *frame->Board();
         ClickButton(board, kCmdDeal);
         TapHand(board, 1);
