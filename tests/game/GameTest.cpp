@@ -99,7 +99,7 @@ private slots:
         SendKey(*board, QEvent::KeyPress, key, 1000);
         for (quint64 t = 1600; t < 3500; t += 33) {
             SendKey(*board, QEvent::KeyRelease, key, t, flagged);
-            SendKey(*board, QEvent::KeyPress, key, flagged ? t : t + 2, flagged);
+            SendKey(*board, QEvent::KeyPress, key, flagged ? t : t + 5, flagged);  // at most 5 ms apart: a repeat
         }
         QTest::qWait(60);  // longer than a release waits
         QCOMPARE(Selected(*board), position > 0 ? QList<int>{position} : QList<int>{});
