@@ -25,11 +25,10 @@ QImage Art(int id, bool inverted = false)
 // A card place as the record describes it: empty, a back, or the suit's face
 // with the rank in two corners (black suits from rows 0 and 3 of the glyph
 // strip, red ones from rows 1 and 2; the ace at the far end), inverted when chosen.
-void DrawCard(QPainter& scene, const CardSprite& s)
+void DrawCard(QPainter& scene, const CardSprite& s, bool chosen = false)
 {
     static const int faces[] = {kBitmapFaceSpades, kBitmapFaceDiamonds, kBitmapFaceHearts, kBitmapFaceClubs};
     const QPoint at(s.rect.left, s.rect.top);
-    const bool chosen = s.highlighted != 0;
     const bool back = s.faceDown || s.suit1 == kSuitBack;
     if (s.suit1 != kSuitEmpty)
         scene.drawImage(at, Art(back ? kBitmapBack : faces[s.suit1 - 1], chosen));
@@ -61,9 +60,11 @@ void CheckScreen(GameBoard& board, int boardId)
                               r.playerHoles[r.playerBackHole], r.playerHoles[r.playerFrontHole]};
     for (int i = 0; i < 4; ++i)
         scene.drawImage(pegs[i].x - 2, pegs[i].y - 2, Art(i < 2 ? kBitmapOpponentPeg : kBitmapPlayerPeg));
+    for (int i = 0; i < 6; ++i)  // of all places, the user's chosen cards alone show inverted
+        DrawCard(scene, r.playerHandSprites[i], r.selected[i] != 0);
     using Places = std::span<const CardSprite>;
-    for (Places group : {Places(r.opponentHandSprites), Places(r.playerHandSprites), Places(r.opponentPileSprites),
-                         Places(r.playerPileSprites), Places(&r.starterSprite, 1)})
+    for (Places group : {Places(r.opponentHandSprites), Places(r.opponentPileSprites), Places(r.playerPileSprites),
+                         Places(&r.starterSprite, 1)})
         for (const CardSprite& s : group)
             DrawCard(scene, s);
     for (const int n = r.shownCount; const QPoint cell : n < 10 ? QList<QPoint>{{4, n}} : QList<QPoint>{{0, n / 10}, {8, n % 10}})
