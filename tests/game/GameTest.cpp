@@ -3,7 +3,6 @@
 
 #include <QHelpEvent>
 #include <QKeyEvent>
-#include <QMouseEvent>
 #include <QToolTip>
 
 namespace {
