@@ -1,9 +1,7 @@
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
 
-#include <QHelpEvent>
 #include <QKeyEvent>
-#include <QToolTip>
 
 namespace {
 
@@ -27,7 +25,7 @@ QList<int> Selected(const GameBoard& board)
 
 } // namespace
 
-// The deal and the user's input: taps, keys, the board's tooltip.
+// The deal and the user's input: taps and keys.
 class GameTest : public QObject {
     Q_OBJECT
 
@@ -130,25 +128,6 @@ private slots:
         PressKey(unpainted, Qt::Key_1);
         PressKey(unpainted, Qt::Key_Return);
         QCOMPARE(unpainted.record.phase, int(kPhaseNoDeal));
-    }
-
-    // Over the board the tooltip tells both scores and whose crib it is.
-    void boardTooltip()
-    {
-        auto board = MakeBoard(2);
-        const auto tipAt = [&board](QPoint p) {
-            QHelpEvent help(QEvent::ToolTip, p, board->mapToGlobal(p));
-            QCoreApplication::sendEvent(board.get(), &help);
-            return QToolTip::isVisible() ? QToolTip::text() : QString();
-        };
-        const QString you = board->record.ownerName;
-        const QPoint corner(board->boardInfo.bmWidth * 2 - 1, board->boardInfo.bmHeight * 2 - 1);
-        QCOMPARE(tipAt(corner + QPoint(1, 1)), QString());  // off the board
-        QCOMPARE(tipAt(QPoint(10, 10)), you + QStringLiteral(" 0 \u00b7 Opponent 0 \u00b7 Opponent's crib"));
-        ClickButton(*board, kCmdDeal);
-        board->PegPoints(kSidePlayer, 87, QStringLiteral("."));
-        board->PegPoints(kSideOpponent, 92, QStringLiteral("."));
-        QCOMPARE(tipAt(corner), you + QStringLiteral(" 87 \u00b7 Opponent 92 \u00b7 Opponent's crib"));
     }
 };
 

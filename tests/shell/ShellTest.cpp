@@ -57,10 +57,18 @@ private slots:
         for (const QAction* action : bar->actions() + frame->ToolsMenu()->actions())
             texts.append(action->text() + action->shortcut().toString());
         QCOMPARE(texts, (QStringList{"NewCtrl+N", "Tools", "About Vennick...", "Options...", "ExitCtrl+Q"}));
+        // Tooltips: New's shortcut; over the board (and only there) both scores and whose crib it is.
+        const auto tipAt = [](QWidget* widget, QPoint at) {
+            QHelpEvent help(QEvent::ToolTip, at, widget->mapToGlobal(at));
+            QCoreApplication::sendEvent(widget, &help);
+            return QToolTip::isVisible() ? QToolTip::text() : QString();
+        };
+        const QPoint corner(board.boardInfo.bmWidth * board.record.scaleX - 1, board.boardInfo.bmHeight * board.record.scaleY - 1);
+        const QString tip = board.record.ownerName + QStringLiteral(" %1 \u00b7 Opponent 0 \u00b7 %2 crib");
+        QCOMPARE(tipAt(&board, corner + QPoint(1, 1)), QString());
+        QCOMPARE(tipAt(&board, corner), tip.arg(0).arg("Opponent's"));
         const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
-        QHelpEvent help(QEvent::ToolTip, onNew, bar->mapToGlobal(onNew));
-        QCoreApplication::sendEvent(bar, &help);
-        QVERIFY(QToolTip::isVisible() && QToolTip::text().contains(QStringLiteral("Ctrl+N")));
+        QVERIFY(tipAt(bar, onNew).contains(QStringLiteral("Ctrl+N")));
         // New ends the game; a game won from far ahead counts 4.
         for (bool byKey : {true, false}) {
             ClickButton(board, kCmdDeal);
@@ -69,6 +77,7 @@ private slots:
                 QTest::keyClick(frame, Qt::Key_N, Qt::ControlModifier);
             } else {
                 board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
+                QCOMPARE(tipAt(&board, {0, 0}), tip.arg(kGameHole).arg("Your"));  // the crib turned with New
                 QTest::mouseClick(bar, Qt::LeftButton, {}, onNew);
             }
             QCOMPARE(board.record.phase, int(kPhaseNoDeal));
