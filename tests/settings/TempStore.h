@@ -28,9 +28,9 @@ public:
 
     QString Folder() const { return dir.path() + QStringLiteral("/Quorvan"); }
     QString FileName() const { return Folder() + QStringLiteral("/Vennick.conf"); }
-    void Write(const QByteArray& content) const
+    void Write(const QByteArray& content, const QString& suffix = QString()) const
     {
-        QFile file(FileName());
+        QFile file(FileName() + suffix);
         QVERIFY(QDir().mkpath(Folder()) && file.open(QIODevice::WriteOnly) && file.write(content) == content.size());
     }
     QByteArray Content() const
