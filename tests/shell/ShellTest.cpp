@@ -124,14 +124,12 @@ private slots:
         const int ok = QDialogButtonBox::Ok, enter = Qt::Key_Return, escape = Qt::Key_Escape;
         const QString about = "About Vennick: 32 Vennick > 2", options = "Options: Normal Wooden Embossed ";
         QTest::newRow("About, Enter") << 0 << 2 << "" << enter << about;
-        QTest::newRow("About, OK") << 0 << 2 << "" << ok << about;
         QTest::newRow("Wooden; Embossed, OK") << 1 << 2 << "3" << ok << options + "2f 3f > 3 saved";
         QTest::newRow("Wooden; Embossed, Escape") << 1 << 2 << "3" << escape << options + "2f 3f > 2";
         QTest::newRow("Embossed; up, up, Enter") << 1 << 3 << "uu" << enter << options + "3f 2f 1f > 1 saved";
         QTest::newRow("Embossed; down round to Normal, up round back, Enter") << 1 << 3 << "du" << enter << options + "3f 1f 3f > 3 saved";
         // A damaged style selects no button; confirmed untouched, it is kept.
         QTest::newRow("7; Enter keeps it") << 1 << 7 << "" << enter << options + " > 7 saved";
-        QTest::newRow("0; Normal, OK") << 1 << 0 << "1" << ok << options + " 1f > 1 saved";
     }
 
     void dialogs()

@@ -3,7 +3,6 @@
 #include "shell/GameApp.h"
 
 #include <QSettings>
-#include <QStandardPaths>
 #include <QTemporaryDir>
 
 #include <cstdio>
@@ -24,12 +23,8 @@ int main(int argc, char** argv)
     // Settings never touch the user's own: the whole run uses a fresh folder.
     QTemporaryDir configHome;
     qputenv("XDG_CONFIG_HOME", configHome.path().toUtf8());
-    QStandardPaths::setTestModeEnabled(true);
     QSettings::setPath(QSettings::NativeFormat, QSettings::UserScope, configHome.path());
 
-    // Real widgets and input without a display, also when run by hand.
-    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
     // The program's own application object, so its start-up can be tested too.
     CGameApp app(argc, argv);
     // Qt Test's crash handler can hang a process that runs several test
