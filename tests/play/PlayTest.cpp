@@ -49,11 +49,8 @@ private slots:
         r.phase = kPhaseDiscard;
         board->ChooseComputerDiscards();
         board->ChooseComputerDiscards();  // once per deal: a second call changes nothing
-        for (int p = 0; p < 6; ++p) {
-            const CardId card = CardNamed(expected.split(' ').value(p));
-            QCOMPARE(r.deal[6 + p], card);
-            QCOMPARE(r.opponentHandSprites[p].suit1, p % 5 == 0 ? kSuitEmpty : CardSuit(card) + 1);
-        }
+        for (int p = 0; p < 6; ++p)
+            QCOMPARE(r.deal[6 + p], CardNamed(expected.split(' ').value(p)));
     }
 
     void card_data()

@@ -83,14 +83,12 @@ private slots:
                            Card(2, 1), Card(3, 2), Card(4, 3), Card(5, 4), Card(6, 1), Card(7, 2), Card(8, 3)});
         ClickButton(*board, kCmdDeal);
         TapHand(*board, 2);
-        QVERIFY(r.playerHandSprites[1].highlighted && r.starterSprite.suit1 == kSuitBack);
         CheckScreen(*board, "66c21b9d7e0035281e48f8cbf403ecfe");
 
         // The starter turned, a card laid by each side, the count shown.
         TapHand(*board, 5);
         ClickButton(*board, kCmdSendToCrib);
         TapHand(*board, 2);
-        QVERIFY(r.playerPileSprites[0].suit1 && r.opponentPileSprites[0].suit1 && r.countVisible);
         CheckScreen(*board, "73ca2df78aca4b5659c67a6eb2c0108b");
 
         board->MovePlayerPegs(12);

@@ -38,7 +38,7 @@ private slots:
         QCOMPARE(SystemOwnerName(), OwnerNameFromGecos(account && account->pw_gecos ? account->pw_gecos : ""));
     }
 
-    // A store that is missing or empty is created with the defaults; any other
+    // A store that is missing is created with the defaults; any other
     // is read, taking only whole 32-bit numbers, and never rewritten by a load.
     // A store the program cannot use never stops the game: the tally goes on
     // in memory, and what is there is left alone unless it can be rewritten clean.
