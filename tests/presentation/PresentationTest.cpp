@@ -75,7 +75,6 @@ private slots:
     void screenFollowsTheRecord()
     {
         auto board = MakeBoard(2);
-        GameRecord& r = board->record;
         CheckScreen(*board, "a02250d908645c74ebe7ff3b20ad18e1");
 
         // Aces, tens and kings of both colours, all four suits; the second one chosen.
@@ -96,7 +95,7 @@ private slots:
         for (const auto& [count, picture] : {std::pair(9, "e4370057cb168a6aa0b09c36b133505d"),
                                              std::pair(10, "af406513f38afde34725d4fdba4594a7"),
                                              std::pair(31, "eea3a0bfcbbab622cea44678a04823c2")}) {
-            r.runningCount = count;
+            board->record.runningCount = count;
             board->RefreshCount();
             CheckScreen(*board, picture);
         }

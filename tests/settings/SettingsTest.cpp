@@ -6,7 +6,6 @@
 #include <QDeadlineTimer>
 #include <QSysInfo>
 
-#include <optional>
 #include <pwd.h>
 #include <random>
 #include <sys/stat.h>
@@ -89,9 +88,7 @@ private slots:
         const int32_t gamesFor = std::max(values[0], 0), won = gamesFor < INT32_MAX ? gamesFor + 4 : gamesFor;
         const QString owner = values[0] >= 0 ? SystemOwnerName() : QStringLiteral("You");
         {
-            std::optional<Unprivileged> unprivileged;
-            if (kind == ReadOnlyFolder || kind == Unreadable)
-                unprivileged.emplace();
+            const Unprivileged unprivileged(kind == ReadOnlyFolder || kind == Unreadable);
             auto board = MakeBoard(1, true);
             QCOMPARE(LogLines(*board), TallyLines(owner, gamesFor, values[1]));
             QCOMPARE(board->record.boardStyle, values[3]);
