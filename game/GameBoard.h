@@ -105,6 +105,8 @@ public:
     void ComputerPlaysCard(int rank1);
     bool PlayerCannotPlay() const;
     bool ComputerCannotPlay() const;
+    // Starts a new count: the running count to 0, no cards in it, 0 shown.
+    void ResetCount();
     void OnOk();
     void ChooseComputerDiscards();
     int ChooseComputerCard() const;  // hand position 1..4, or 0 for none

@@ -20,14 +20,15 @@ bool CannotPlay(const CardSprite hand[6], const CardId cards[6], int runningCoun
     return true;
 }
 
-// The running count and the cards it is made of always start again together.
-void ResetCount(GameRecord& record)
+} // namespace
+
+void GameBoard::ResetCount()
 {
+    // The running count, the cards it is made of and its display start again together.
     record.runningCount = 0;
     record.playSequence.entries[0] = -1;
+    RefreshCount();
 }
-
-} // namespace
 
 void GameBoard::StartPlay()
 {
@@ -68,9 +69,8 @@ void GameBoard::PlayerPlaysCard(int rank1)
     SequenceAppend(record.playSequence, rank1);
     PegPoints(kSidePlayer, ScorePlay(record.playSequence), QString());
     RefreshCount();
-    // The display keeps showing 31 until the next card is laid.
     if (record.runningCount == kMaxCount)
-        ResetCount(record);
+        ResetCount();
 }
 
 void GameBoard::ComputerTurn()
@@ -104,7 +104,7 @@ void GameBoard::ComputerTurn()
     // Neither side can lay a card: the go, unless 31 has already scored.
     if (record.runningCount > 0 && record.runningCount < kMaxCount)
         PegPoints(record.lastToPlay, 1, QStringLiteral(" for a go"));
-    ResetCount(record);
+    ResetCount();
     // A go point that won the game ends the play where it stands.
     if (record.gameOver != 0)
         return;
@@ -114,6 +114,9 @@ void GameBoard::ComputerTurn()
         if (PlayerScore() == kGameHole || OpponentScore() == kGameHole)
             return;
         record.phase = kPhasePlayOver;
+        // The show has no running count.
+        record.countVisible = 0;
+        RefreshCount();
         if (record.playerCrib == 0)
             ShowScorePlayerHand();
         else

@@ -48,20 +48,18 @@ void GameBoard::PegPoints(int side, int points, const QString& suffix)
         if (record.phase < kPhaseCountStart)
             ShowOk();
     } else {
-        // When the computer's scoring card leaves nobody able to play, its
-        // last-card point rides along with the card's own points (unannounced).
-        int pegged = points;
-        if (record.phase < kPhaseCountStart && PlayerCannotPlay() && ComputerCannotPlay() && points != 1
-            && record.runningCount < 31)
-            pegged = points + 1;
-        MoveOpponentPegs(pegged);
+        MoveOpponentPegs(points);
         LogMessage(announced);
         if (record.phase < kPhaseCountStart && PlayerCannotPlay()) {
             if (!ComputerCannotPlay()) {
                 ShowOk();
             } else {
-                record.runningCount = 0;
-                record.playSequence.entries[0] = -1;
+                // The computer's scoring card leaves nobody able to play: the
+                // count starts again, and below 31 that card also takes the go.
+                const bool go = points != 1 && record.runningCount < 31;
+                ResetCount();
+                if (go)
+                    PegPoints(kSideOpponent, 1, QStringLiteral(" for a go"));
             }
         }
     }
