@@ -124,14 +124,15 @@ void GameBoard::NewGame()
     GameRecord& r = record;
     InvalidatePegRects();
 
+    // The log starts afresh before the save, which may have to say it failed.
+    if (messageLog)
+        messageLog->clear();
     r.savedPlayerCrib = r.savedPlayerCrib ? 0 : 1;
     SaveSettings();
     ResetTable();
     RefreshCount();
     SyncCardSprites();
     r.starterSprite.suit1 = kSuitEmpty;
-    if (messageLog)
-        messageLog->clear();
     UpdatePegRects(true);
     LoadSettings();
 

@@ -103,6 +103,8 @@ struct GameRecord {
     int32_t shownCount = 0;
     int32_t countVisible = 0;
     int32_t boardStyle = 0;
+    // 1: every score in the log is followed by a line of its reasons.
+    int32_t explainScores = 0;
     int32_t scaleX = 0;
     int32_t scaleY = 0;
     int32_t firstPaintPending = 0;

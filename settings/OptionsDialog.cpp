@@ -3,6 +3,7 @@
 #include "game/GameBoard.h"
 
 #include <QButtonGroup>
+#include <QCheckBox>
 #include <QDialogButtonBox>
 #include <QKeyEvent>
 #include <QRadioButton>
@@ -32,6 +33,9 @@ COptionsDlg::COptionsDlg(QWidget* parent)
         button->installEventFilter(this);
         layout->addWidget(button, 0, Qt::AlignLeft);
     }
+
+    explainBox = new QCheckBox(QStringLiteral("&Explain each score"), this);
+    layout->addWidget(explainBox, 0, Qt::AlignLeft);
 
     buttonBox = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
     connect(buttonBox, &QDialogButtonBox::accepted, this, &QDialog::accept);
@@ -104,8 +108,11 @@ void GameBoard::OnOptions()
 {
     COptionsDlg dialog(this);
     dialog.SetSelectedStyle(record.boardStyle);
-    if (dialog.exec() == QDialog::Accepted)
+    dialog.ExplainBox()->setChecked(record.explainScores != 0);
+    if (dialog.exec() == QDialog::Accepted) {
+        record.explainScores = dialog.ExplainBox()->isChecked() ? 1 : 0;
         ApplyBoardStyle(dialog.selectedStyle);
+    }
 }
 
 void GameBoard::ApplyBoardStyle(int style)

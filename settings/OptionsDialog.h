@@ -5,6 +5,7 @@
 #include <cstdint>
 
 class QButtonGroup;
+class QCheckBox;
 class QDialogButtonBox;
 class QRadioButton;
 
@@ -15,7 +16,8 @@ enum StyleButtonId : int {
     kStyleButtonEmbossed = 1002,
 };
 
-// The Options dialog: one radio button per board style, confirmed with OK.
+// The Options dialog: one radio button per board style and the choice to
+// explain each score, confirmed with OK.
 class COptionsDlg : public QDialog {
     Q_OBJECT
 
@@ -32,6 +34,7 @@ public:
     void OnEmbossed();
 
     QRadioButton* StyleButton(int id) const;
+    QCheckBox* ExplainBox() const { return explainBox; }
     QDialogButtonBox* ButtonBox() const { return buttonBox; }
 
 protected:
@@ -41,5 +44,6 @@ private:
     void ShowSelection();
 
     QButtonGroup* styleGroup = nullptr;
+    QCheckBox* explainBox = nullptr;
     QDialogButtonBox* buttonBox = nullptr;
 };

@@ -2,6 +2,7 @@
 
 #include "game/GameBoard.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QLockFile>
 #include <QSettings>
@@ -78,12 +79,23 @@ bool ReadInt32(const QSettings& settings, const QString& name, int32_t& field)
     return true;
 }
 
+// A tally counter: a whole number of games, never negative (the program never
+// wrote one); anything else counts as missing.
+bool ReadCount(const QSettings& settings, const QString& name, int32_t& field)
+{
+    int32_t count = 0;
+    if (!ReadInt32(settings, name, count) || count < 0)
+        return false;
+    field = count;
+    return true;
+}
+
 // Adds what this window won since it last read or wrote the store to the
 // tally the store holds now, so that two copies on one store lose no game.
 int32_t MergedCount(const QSettings& settings, const QString& name, int32_t inHand, int32_t stored)
 {
     int32_t now = stored;
-    ReadInt32(settings, name, now);
+    ReadCount(settings, name, now);
     const qint64 merged = qint64(now) + (qint64(inHand) - qint64(stored));
     return static_cast<int32_t>(std::clamp<qint64>(merged, std::numeric_limits<int32_t>::min(),
                                                    std::numeric_limits<int32_t>::max()));
@@ -136,6 +148,7 @@ bool GameBoard::WriteStore(QSettings& settings)
     settings.setValue(QStringLiteral("Against"), r.gamesAgainst);
     settings.setValue(QStringLiteral("Crib"), r.savedPlayerCrib);
     settings.setValue(QStringLiteral("Board"), r.boardStyle);
+    settings.setValue(QStringLiteral("Explain"), r.explainScores);
     settings.sync();
     if (locked)
         lock.unlock();
@@ -154,6 +167,7 @@ void GameBoard::LoadSettings()
         r.gamesFor = 0;
         r.gamesAgainst = 0;
         r.boardStyle = 1;
+        r.explainScores = 0;
     }
 
     std::optional<QSettings> settings;
@@ -172,14 +186,17 @@ void GameBoard::LoadSettings()
 
     if (state == StoreState::Present) {
         if (!storeBehind) {
-            ReadInt32(*settings, QStringLiteral("For"), r.gamesFor);
-            ReadInt32(*settings, QStringLiteral("Against"), r.gamesAgainst);
+            ReadCount(*settings, QStringLiteral("For"), r.gamesFor);
+            ReadCount(*settings, QStringLiteral("Against"), r.gamesAgainst);
             int32_t crib = 0;
             // The crib alternates by inverting 0 and 1; a damaged value would
             // stop it, so anything but 0 means the user's.
             if (ReadInt32(*settings, QStringLiteral("Crib"), crib))
                 r.savedPlayerCrib = crib != 0 ? 1 : 0;
             ReadInt32(*settings, QStringLiteral("Board"), r.boardStyle);
+            int32_t explain = 0;
+            if (ReadInt32(*settings, QStringLiteral("Explain"), explain) && (explain == 0 || explain == 1))
+                r.explainScores = explain;
             storedFor = r.gamesFor;
             storedAgainst = r.gamesAgainst;
         }
@@ -198,5 +215,10 @@ void GameBoard::SaveSettings()
     std::optional<QSettings> settings;
     // A store that is missing is created by the next load, not here; until
     // then, as when it cannot be written, it is behind this run.
+    const bool wasBehind = storeBehind;
     storeBehind = !(OpenStore(settings) == StoreState::Present && WriteStore(*settings));
+    // Said once as the store falls behind, not at every save that follows.
+    if (storeBehind && !wasBehind)
+        LogMessage(QStringLiteral("Could not save the tally to %1: it is kept while Vennick runs.")
+                       .arg(QDir::toNativeSeparators(StoreFileName())));
 }

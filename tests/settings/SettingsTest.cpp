@@ -45,28 +45,33 @@ private slots:
     {
         QTest::addColumn<int>("kind");
         QTest::addColumn<QByteArray>("content");  // of a Plain store; null: none
-        QTest::addColumn<QList<int>>("values");   // as read: For (-1: the store is not read), Against, Crib, Board
+        // As read: For (-1: the store is not read), Against, Crib, Board, Explain.
+        QTest::addColumn<QList<int>>("values");
         QTest::addColumn<bool>("writable");       // a save rewrites it
         const QByteArray five("[General]\nAgainst=7\nBoard=2\nCrib=0\nFor=5\n");
         QByteArray garbage;
         for (std::mt19937 random(7); garbage.size() < 4096;)
             garbage.append(static_cast<char>(random() % 256));
-        QTest::newRow("no store") << int(Plain) << QByteArray() << QList<int>{0, 0, 1, 1} << true;
-        QTest::newRow("Wooden, Crib 0") << int(Plain) << five << QList<int>{5, 7, 0, 2} << true;
+        QTest::newRow("no store") << int(Plain) << QByteArray() << QList<int>{0, 0, 1, 1, 0} << true;
+        QTest::newRow("Wooden, Crib 0") << int(Plain) << five << QList<int>{5, 7, 0, 2, 0} << true;
         QTest::newRow("Board 4 is Embossed, Crib 2 is 1") << int(Plain) << QByteArray("[General]\nBoard=4\nCrib=2\n")
-                                                         << QList<int>{0, 0, 1, 4} << true;
+                                                         << QList<int>{0, 0, 1, 4, 0} << true;
+        // Negative counts were never written: they count as missing, as an Explain that is not 0 or 1.
+        QTest::newRow("negative tallies, Explain 2") << int(Plain) << QByteArray("[General]\nFor=-5\nAgainst=-1\nExplain=2\n")
+                                                    << QList<int>{0, 0, 1, 1, 0} << true;
+        QTest::newRow("Explain 1") << int(Plain) << QByteArray("[General]\nExplain=1\nFor=3\n") << QList<int>{3, 0, 1, 1, 1} << true;
         QTest::newRow("not numbers") << int(Plain) << QByteArray("[General]\nFor=five\nAgainst=7x\nCrib=yes\nBoard=2.5\n")
-                                     << QList<int>{0, 0, 1, 1} << true;
+                                     << QList<int>{0, 0, 1, 1, 0} << true;
         // The largest 32-bit value, then values that cut to 32 bits would read as -1, 0 and 2 (Wooden).
         QTest::newRow("32 bits and beyond")
             << int(Plain) << QByteArray("[General]\nFor=2147483647\nAgainst=2147483648\nCrib=4294967296\nBoard=4294967298\n")
-            << QList<int>{2147483647, 0, 1, 1} << true;
-        QTest::newRow("garbage bytes") << int(Plain) << garbage << QList<int>{0, 0, 1, 1} << true;
-        QTest::newRow("truncated") << int(Plain) << five.left(five.indexOf("Crib") + 2) << QList<int>{0, 7, 1, 2} << true;
-        QTest::newRow("huge") << int(Plain) << five + QByteArray(8 << 20, 'x') << QList<int>{-1, 0, 1, 1} << false;
-        QTest::newRow("a named pipe, not a file") << int(Pipe) << QByteArray() << QList<int>{-1, 0, 1, 1} << false;
-        QTest::newRow("read-only folder") << int(ReadOnlyFolder) << five << QList<int>{5, 7, 0, 2} << false;
-        QTest::newRow("unreadable file") << int(Unreadable) << five << QList<int>{-1, 0, 1, 1} << false;
+            << QList<int>{2147483647, 0, 1, 1, 0} << true;
+        QTest::newRow("garbage bytes") << int(Plain) << garbage << QList<int>{0, 0, 1, 1, 0} << true;
+        QTest::newRow("truncated") << int(Plain) << five.left(five.indexOf("Crib") + 2) << QList<int>{0, 7, 1, 2, 0} << true;
+        QTest::newRow("huge") << int(Plain) << five + QByteArray(8 << 20, 'x') << QList<int>{-1, 0, 1, 1, 0} << false;
+        QTest::newRow("a named pipe, not a file") << int(Pipe) << QByteArray() << QList<int>{-1, 0, 1, 1, 0} << false;
+        QTest::newRow("read-only folder") << int(ReadOnlyFolder) << five << QList<int>{5, 7, 0, 2, 0} << false;
+        QTest::newRow("unreadable file") << int(Unreadable) << five << QList<int>{-1, 0, 1, 1, 0} << false;
     }
 
     void stores()
@@ -92,9 +97,10 @@ private slots:
             auto board = MakeBoard(1, true);
             QCOMPARE(LogLines(*board), TallyLines(owner, gamesFor, values[1]));
             QCOMPARE(board->record.boardStyle, values[3]);
+            QCOMPARE(board->record.explainScores, values[4]);
             QVERIFY(HoldsBoard(*board, values[3]));
             if (kind == Plain)
-                QCOMPARE(store.Content(), content.isEmpty() ? QByteArray("[General]\nAgainst=0\nBoard=1\nCrib=1\nFor=0\n") : content);
+                QCOMPARE(store.Content(), content.isEmpty() ? QByteArray("[General]\nAgainst=0\nBoard=1\nCrib=1\nExplain=0\nFor=0\n") : content);
             // The first crib follows the stored one: after 1 the opponent's.
             board->OnDeal();
             QCOMPARE(LogLines(*board).last(), values[2] ? QStringLiteral("Opponent's Crib.") : QStringLiteral("Your Crib."));
@@ -109,6 +115,11 @@ private slots:
             const QDeadlineTimer second(1000);
             board->PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
             QVERIFY(!second.hasExpired() && !QApplication::activeModalWidget());
+            // A save that fails is said once, with the store's path; the tally stays in hand.
+            const QString unsaved = QStringLiteral("Could not save the tally to %1: it is kept while Vennick runs.").arg(store.FileName());
+            QCOMPARE(LogLines(*board).last(), writable ? QStringLiteral("Please click New to play again.") : unsaved);
+            board->SaveSettings();
+            QCOMPARE(LogLines(*board).count(unsaved), writable ? 0 : 1);
             board->NewGame();
             QCOMPARE(LogLines(*board), TallyLines(owner, won, against));
             board->OnDeal();  // the crib still turns
@@ -118,8 +129,8 @@ private slots:
             QFile::setPermissions(store.Folder(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
         const QFileInfo after(store.FileName());
         if (writable) {  // rewritten clean, with every value that could be read or merged; the crib turned with New game
-            QCOMPARE(store.Content(), QStringLiteral("[General]\nAgainst=%1\nBoard=%2\nCrib=%3\nFor=%4\n")
-                                          .arg(values[1] + 1).arg(values[3]).arg(values[2] ? 0 : 1).arg(won).toUtf8());
+            QCOMPARE(store.Content(), QStringLiteral("[General]\nAgainst=%1\nBoard=%2\nCrib=%3\nExplain=%4\nFor=%5\n")
+                                          .arg(values[1] + 1).arg(values[3]).arg(values[2] ? 0 : 1).arg(values[4]).arg(won).toUtf8());
         } else {
             QCOMPARE((QList<qint64>{after.exists(), after.isDir(), after.size()}),
                      (QList<qint64>{before.exists(), before.isDir(), before.size()}));
