@@ -96,6 +96,8 @@ public:
     void ScoreOpponentHand();
     void ScoreCrib();
     void PegPoints(int side, int points, const QString& suffix);
+    // Games a win adds to the tally: 1, 2 when the loser has 90 or less, 4 when 60 or less.
+    static int32_t GamesForWin(int loserScore);
 
     // --- play/
     void StartPlay();
@@ -121,14 +123,15 @@ public:
     QPoint DevicePoint(QPointF point) const;
     // The message log's board rectangle.
     Rect LogRect() const;
-    // The game window's size in device pixels for a scale factor.
-    QSize DeviceWindowSize(int scale) const;
+    // The game window's size in device pixels for a scale factor; without the
+    // band it ends at the log's border.
+    QSize DeviceWindowSize(int scale, bool band = true) const;
     void Invalidate(const Rect& r);
     void LoadImages();
     void ReloadBoardBitmap();
     // The scale factors for a game window of this size, each at least 1.
     static int ScaleFactorX(int width);
-    static int ScaleFactorY(int height);
+    int ScaleFactorY(int height) const;
 
     BitmapInfo boardInfo;
     BitmapInfo cardInfo;
@@ -154,8 +157,21 @@ public:
     int32_t storedFor = 0;
     int32_t storedAgainst = 0;
 
-    // --- game/: the board's tooltip with both scores and whose crib it is
+    // --- game/: views of the record in words
+    // The board's tooltip: both scores and whose crib it is.
     QString BoardTip() const;
+    // The status line: the tooltip and what the game waits for; at the game's
+    // end the final score and what the tally gained.
+    QString StatusLine() const;
+    // After the first deal and before the game's end.
+    bool GameInProgress() const;
+
+signals:
+    // Something the status line shows may have changed; sent once after a
+    // burst of changes, when the event loop next runs.
+    void StatusChanged();
+
+public:
 
 protected:
     void paintEvent(QPaintEvent* event) override;
@@ -170,6 +186,8 @@ private:
     // Writes the four values, the tally merged with the store's, under its lock.
     bool WriteStore(class QSettings& settings);
     void PlaceCountRect();
+    // Schedules StatusChanged once for everything changed until then.
+    void NoteStatusChange();
     void MovePegs(int points, void (GameBoard::*setBack)(int), void (GameBoard::*setFront)(int),
                   const int32_t& frontHole);
     void FirstPaintSetup();
@@ -195,4 +213,5 @@ private:
     KeyRelease lastRelease;
     // Runs while the last release of Enter or Escape waits to act.
     QBasicTimer pendingRelease;
+    QBasicTimer pendingStatus;
 };

@@ -114,10 +114,14 @@ void GameBoard::keyReleaseEvent(QKeyEvent* event)
 
 void GameBoard::timerEvent(QTimerEvent* event)
 {
-    if (event->timerId() == pendingRelease.timerId())
+    if (event->timerId() == pendingRelease.timerId()) {
         ActOnPendingRelease();
-    else
+    } else if (event->timerId() == pendingStatus.timerId()) {
+        pendingStatus.stop();
+        emit StatusChanged();
+    } else {
         QWidget::timerEvent(event);
+    }
 }
 
 void GameBoard::ActOnPendingRelease()
@@ -208,6 +212,7 @@ void GameBoard::SetButtonShown(QPushButton* button, bool shown)
 {
     if (button != nullptr)
         button->setVisible(shown);
+    NoteStatusChange();
 }
 
 void GameBoard::ShowOk()

@@ -12,4 +12,5 @@ void GameBoard::LogMessage(const QString& text)
     if (messageLog->fontMetrics().horizontalAdvance(text) > messageLog->viewport()->width())
         item->setToolTip(text);
     messageLog->scrollToBottom();
+    NoteStatusChange();
 }

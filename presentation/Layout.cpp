@@ -69,16 +69,18 @@ int GameBoard::ScaleFactorX(int width)
     return std::max(1, width / kLogicalWidth);
 }
 
-int GameBoard::ScaleFactorY(int height)
+int GameBoard::ScaleFactorY(int height) const
 {
-    return std::max(1, (height + kHeightAllowance) / kLogicalHeight);
+    // A window without the band under the log, which ends at the log's
+    // border, keeps the factor the log fits at.
+    return std::max({1, (height + kHeightAllowance) / kLogicalHeight, height / LogRect().bottom});
 }
 
-QSize GameBoard::DeviceWindowSize(int scale) const
+QSize GameBoard::DeviceWindowSize(int scale, bool band) const
 {
     // Tall enough for the whole log, which at scale 1 ends a pixel below 268.
-    return QSize(kLogicalWidth * scale,
-                 std::max(kLogicalHeight * scale - kHeightAllowance, LogRect().bottom * scale));
+    const int logBottom = LogRect().bottom * scale;
+    return QSize(kLogicalWidth * scale, band ? std::max(kLogicalHeight * scale - kHeightAllowance, logBottom) : logBottom);
 }
 
 Rect GameBoard::LogRect() const
@@ -111,6 +113,8 @@ void GameBoard::Invalidate(const Rect& r)
     if (record.firstPaintPending)
         return;
     update(ScaledRect(r));
+    // Whatever is drawn anew may change what the status line says.
+    NoteStatusChange();
 }
 
 void GameBoard::CreateActionButtons()

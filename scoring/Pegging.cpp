@@ -13,8 +13,14 @@ int32_t AddGames(int32_t tally, int32_t games)
     return tally > kMax - games ? kMax : tally + games;
 }
 
-// A win counts 1 game, 2 when the loser has 90 or less, 4 when 60 or less.
-int32_t GamesForWin(int loserScore)
+bool IsShowPhase(int32_t phase)
+{
+    return phase == kPhaseHandCounted || phase == kPhaseCribCounted || phase == kPhasePlayOver;
+}
+
+} // namespace
+
+int32_t GameBoard::GamesForWin(int loserScore)
 {
     int32_t games = 1;
     if (loserScore <= 90)
@@ -23,13 +29,6 @@ int32_t GamesForWin(int loserScore)
         games += 2;
     return games;
 }
-
-bool IsShowPhase(int32_t phase)
-{
-    return phase == kPhaseHandCounted || phase == kPhaseCribCounted || phase == kPhasePlayOver;
-}
-
-} // namespace
 
 void GameBoard::PegPoints(int side, int points, const QString& suffix)
 {

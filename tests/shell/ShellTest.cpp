@@ -10,6 +10,7 @@
 #include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
+#include <QMessageBox>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QScreen>
@@ -42,7 +43,7 @@ private slots:
         QTRY_COMPARE(QApplication::focusWidget(), static_cast<QWidget*>(&board));
         // The game window fills the frame at its chosen factor, the frame inside the screen.
         QCOMPARE(frame->windowTitle(), QStringLiteral("Vennick"));
-        QCOMPARE(board.size(), frame->GameWindowSize(board.record.scaleY, 1.0));
+        QCOMPARE(board.size(), frame->GameWindowSize(board.record.scaleY, 1.0, board.height() > board.LogRect().bottom * board.record.scaleY));
         QCOMPARE(frame->minimumSize(), frame->maximumSize());
         const QRect available = frame->screen()->availableGeometry();
         QVERIFY(available.contains(frame->frameGeometry()));
@@ -51,9 +52,10 @@ private slots:
 
         QMenuBar* bar = frame->menuBar();
         QStringList texts;
-        for (const QAction* action : bar->actions() + frame->ToolsMenu()->actions())
+        for (const QAction* action : bar->actions() + frame->ToolsMenu()->actions() + frame->HelpMenu()->actions())
             texts.append(action->text() + action->shortcut().toString());
-        QCOMPARE(texts, (QStringList{"NewCtrl+N", "Tools", "About Vennick...", "Options...", "ExitCtrl+Q"}));
+        QCOMPARE(texts, (QStringList{"&NewCtrl+N", "&Tools", "&Help", "&About Vennick...", "&Options...", "E&xitCtrl+Q",
+                                     "&How to PlayF1"}));
         // Tooltips: New's shortcut; over the board (and only there) both scores and whose crib it is.
         const auto tipAt = [](QWidget* widget, QPoint at) {
             QHelpEvent help(QEvent::ToolTip, at, widget->mapToGlobal(at));
@@ -66,15 +68,41 @@ private slots:
         QCOMPARE(tipAt(&board, corner), tip.arg(0).arg("Opponent's"));
         const QPoint onNew = bar->actionGeometry(frame->NewAction()).center();
         QVERIFY(tipAt(bar, onNew).contains(QStringLiteral("Ctrl+N")));
-        // New ends the game; a game won from far ahead counts 4.
+        // The status bar: both scores, whose crib and what the game waits for.
+        const auto status = [frame] {
+            QCoreApplication::processEvents();
+            return frame->StatusLabel()->text();
+        };
+        QCOMPARE(status(), tip.arg(0).arg("Opponent's") + QStringLiteral(" \u00b7 Click Deal to start"));
+        // New asks during a game: Enter (Cancel is the default) and Escape keep
+        // it, Abandon ends it. After the game's end it asks nothing, and a game
+        // won from far ahead counts 4.
         for (bool byKey : {true, false}) {
             ClickButton(board, kCmdDeal);
             TapHand(board, 1);
             if (byKey) {
-                QTest::keyClick(frame, Qt::Key_N, Qt::ControlModifier);
+                QCOMPARE(status(), tip.arg(0).arg("Opponent's") + QStringLiteral(" \u00b7 Choose one more card for the crib"));
+                for (int answer : {int(Qt::Key_Return), int(Qt::Key_Escape), 0}) {
+                    QVERIFY(QTest::qWaitForWindowActive(frame));  // as the question closed
+                    QString asked;
+                    QTimer::singleShot(0, frame, [&asked, answer] {
+                        auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+                        QTimer::singleShot(2000, box, &QDialog::reject);  // left open, it cannot hang the run
+                        asked = box->text();
+                        for (QAbstractButton* button : box->buttons())
+                            if (answer == 0 && box->buttonRole(button) == QMessageBox::DestructiveRole)
+                                button->click();
+                        if (answer != 0)
+                            QTest::keyPress(box, Qt::Key(answer));  // the box is gone before a release
+                    });
+                    QTest::keyClick(frame, Qt::Key_N, Qt::ControlModifier);
+                    QCOMPARE(asked, QStringLiteral("Abandon this game?"));
+                    QCOMPARE(board.record.phase, answer != 0 ? int(kPhaseDiscard) : int(kPhaseNoDeal));
+                }
             } else {
                 board.PegPoints(kSidePlayer, kGameHole, QStringLiteral(" for your hand"));
                 QCOMPARE(tipAt(&board, {0, 0}), tip.arg(kGameHole).arg("Your"));  // the crib turned with New
+                QCOMPARE(status(), QStringLiteral("You won 121 to 0: a double skunk, 4 games. Click New to play again."));
                 QTest::mouseClick(bar, Qt::LeftButton, {}, onNew);
             }
             QCOMPARE(board.record.phase, int(kPhaseNoDeal));
@@ -88,20 +116,25 @@ private slots:
     }
 
     // The frame's size: the largest whole factor in device pixels that fits
-    // the screen, also at 150% and 125%. The game window asked for yields
-    // exactly the factor, and fits with the chrome unless the factor is the least.
+    // the screen, also at 150% and 125%, without the band under the log only
+    // where the band alone keeps that factor out. The game window asked for
+    // yields exactly the factor, and fits with the chrome unless the factor is the least.
     void chooseScale()
     {
         const QSize chrome(16, 70);
         CMainFrame frame;
+        using Scale = CMainFrame::Scale;
         for (const auto& [available, ratio, scale] :
-             {std::tuple(QSize(1920, 1080), 1.0, 3), std::tuple(QSize(496, 658), 1.0, 2), std::tuple(QSize(496, 657), 1.0, 1),
-              std::tuple(QSize(683, 512), 1.5, 2), std::tuple(QSize(1536, 864), 1.25, 3)}) {
+             {std::tuple(QSize(1920, 1080), 1.0, Scale{3, true}), std::tuple(QSize(496, 658), 1.0, Scale{2, true}),
+              std::tuple(QSize(496, 657), 1.0, Scale{2, false}), std::tuple(QSize(496, 607), 1.0, Scale{1, true}),
+              std::tuple(QSize(1024, 877), 1.0, Scale{3, false}), std::tuple(QSize(683, 512), 1.5, Scale{2, true}),
+              std::tuple(QSize(1536, 864), 1.25, Scale{3, true})}) {
             QCOMPARE(frame.ChooseScale(available, chrome, ratio), scale);
-            const QSize window = frame.GameWindowSize(scale, ratio);
+            const QSize window = frame.GameWindowSize(scale.factor, ratio, scale.band);
             const QSize device = (QSizeF(window) * ratio).toSize();
-            QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), GameBoard::ScaleFactorY(device.height())), QSize(scale, scale));
-            QVERIFY(scale == 1 || available.expandedTo(window + chrome) == available);
+            QCOMPARE(QSize(GameBoard::ScaleFactorX(device.width()), frame.Board()->ScaleFactorY(device.height())),
+                     QSize(scale.factor, scale.factor));
+            QVERIFY(scale.factor == 1 || available.expandedTo(window + chrome) == available);
         }
     }
 
