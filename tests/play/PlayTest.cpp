@@ -118,7 +118,8 @@ void PlayTest::deal_data()
     // shown; ret: Enter; all: every hand place tapped and keyed, then Enter;
     // you=N, opp=N: pegs moved on N holes.
     QTest::addColumn<QString>("script");
-    // Log lines / pegs (back-front, the user's first) / count / button.
+    // Log lines / pegs (back-front, the user's first) / count / button / what
+    // the status line says the game waits for.
     QTest::addColumn<QString>("expected");
 
     const QString runsTo31 = "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC 5H";  // the computer deals
@@ -129,51 +130,51 @@ void PlayTest::deal_data()
     // The play.
     QTest::newRow("user's 31; no card while Ok shows; the computer leads after it; no double go")
         << "2S 4S 8S QS 9H TH 7D KD 7H 7C 3C 6C 5D" << false << "2S 4S 8S QS ok QS"
-        << "You peg 2. / Opponent pegs 1 for a go. | 0-2 0-1 | none | 4";
+        << "You peg 2. / Opponent pegs 1 for a go. | 0-2 0-1 | none | 4 | Score your hand";
     QTest::newRow("computer's 31 laid two cards at once; the user leads; user's go")
-        << runsTo31 << false << "2S 8D TH QC" << "Opponent pegs 2. / You peg 1 for a go. | 0-1 0-2 | none | 4";
+        << runsTo31 << false << "2S 8D TH QC" << "Opponent pegs 2. / You peg 1 for a go. | 0-1 0-2 | none | 4 | Score your hand";
     // A new count shows 0 at once, not the old total.
     QTest::newRow("0 shown after the user's 31, while Ok waits")
-        << "2S 4S 8S QS 9H TH 7D KD 7H 7C 3C 6C 5D" << false << "2S 4S 8S QS" << "You peg 2. | 0-2 122-0 | 0 | 6";
+        << "2S 4S 8S QS 9H TH 7D KD 7H 7C 3C 6C 5D" << false << "2S 4S 8S QS" << "You peg 2. | 0-2 122-0 | 0 | 6 | Press Ok";
     QTest::newRow("0 shown after the user's go, while Ok waits") << repeatedGo << false << "kKH k7D kAS k2S"
-        << go + go + "You peg 1 for a go. | 0-1 122-0 | 0 | 6";
+        << go + go + "You peg 1 for a go. | 0-1 122-0 | 0 | 6 | Press Ok";
     QTest::newRow("go repeated until the user pegs it, by keyboard") << repeatedGo << false << "kKH k7D kAS k2S ret"
-        << go + go + "You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 0-1 | none | 4";
+        << go + go + "You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 0-1 | none | 4 | Score your hand";
     QTest::newRow("computer's last card announces its go after its own points")
         << "AS AD 2H 3C 9S TS 3D 7S 5H 7H KD QD 6C" << false << "AS AD 2H 3C"
-        << "Opponent pegs 2. / Opponent pegs 1 for a go. | 122-0 2-3 | none | 4";
+        << "Opponent pegs 2. / Opponent pegs 1 for a go. | 122-0 2-3 | none | 4 | Score your hand";
     QTest::newRow("after the computer's go the user leads") << "AC 7C TD JD 2H 3H 8H JS QS TS 4D 5D 6C" << false
         << "AC 7C TD JD ok"
-        << "Opponent pegs 1 for a go. / Opponent pegs 2. / You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 3-4 | none | 4";
+        << "Opponent pegs 1 for a go. / Opponent pegs 2. / You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 3-4 | none | 4 | Score your hand";
     QTest::newRow("computer waits for Ok after scoring while the user is stuck")
         << "8S 9S TS KS AC 3C 5D 2D 2H 2C 6H 7H 4D" << false << "8S 9S ok TS KS"
-        << "Opponent pegs 2. / Opponent pegs 6. / Opponent pegs 1 for a go. / " + go + "You peg 1 for a go. | 0-1 8-9 | none | 4";
+        << "Opponent pegs 2. / Opponent pegs 6. / Opponent pegs 1 for a go. / " + go + "You peg 1 for a go. | 0-1 8-9 | none | 4 | Score your hand";
     QTest::newRow("a card past 31 is refused")
-        << "4C 5C 7C TC AH 2H QD KD QH TH 3S 6S 8S" << false << "7C TC 5C 4C" << go + "You peg 2. | 0-2 122-0 | 0 | 6";
+        << "4C 5C 7C TC AH 2H QD KD QH TH 3S 6S 8S" << false << "7C TC 5C 4C" << go + "You peg 2. | 0-2 122-0 | 0 | 6 | Press Ok";
     QTest::newRow("user deals: the computer leads; the user's last card ends the play")
-        << lastCardGo << true << "AS AH 6D QH" << "You peg 1 for a go. | 0-1 122-0 | none | 5";
+        << lastCardGo << true << "AS AH 6D QH" << "You peg 1 for a go. | 0-1 122-0 | none | 5 | Score the computer's hand";
     QTest::newRow("His Heels for the user; the computer leads after Ok")
-        << "AS AH 6D QH AD 3D 4S 2S 2C 4H 7D QD JD" << true << "ok" << "You peg 2 for His Heels. | 0-2 122-0 | 4 | 0";
+        << "AS AH 6D QH AD 3D 4S 2S 2C 4H 7D QD JD" << true << "ok" << "You peg 2 for His Heels. | 0-2 122-0 | 4 | 0 | Your turn";
     QTest::newRow("His Heels for the computer; the user leads")
-        << "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC JH" << false << "2S" << "Opponent pegs 2 for His Heels. | 122-0 0-2 | 12 | 0";
+        << "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC JH" << false << "2S" << "Opponent pegs 2 for His Heels. | 122-0 0-2 | 12 | 0 | Your turn";
     // The show: the non-dealer's hand, the dealer's, then the crib.
     QTest::newRow("show after the computer's deal") << runsTo31 << false << "2S 8D TH QC ok ok ok"
         << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / Opponent pegs 12 for his hand. / "
-           "Opponent pegs 6 for the crib. | 1-7 14-20 | none | 1";
+           "Opponent pegs 6 for the crib. | 1-7 14-20 | none | 1 | Click Deal for the next hand";
     // Four of a suit with a starter of another: a flush in a hand, none in the crib.
     QTest::newRow("show after the user's deal, by keyboard") << lastCardGo << true << "AS AH 6D QH ret ret ret"
         << "You peg 1 for a go. / Opponent pegs 12 for his hand. / You peg 4 for your hand. / You peg 0 for the crib. "
-           "| 1-5 0-12 | none | 1";
+           "| 1-5 0-12 | none | 1 | Click Deal for the next hand";
     // A win ends the deal where it stands: no button, and nothing moves.
     QTest::newRow("a go point wins on the last card")
-        << lastCardGo << true << "you=120 AS AH 6D QH all" << "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0";
+        << lastCardGo << true << "you=120 AS AH 6D QH all" << "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0 | You won 121 to 0: a double skunk, 4 games. Click New to play again.";
     QTest::newRow("a go point wins with the computer's cards in hand") << repeatedGo << false << "you=120 KH 7D AS 2S all"
-        << go + go + "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0";
+        << go + go + "You peg 1 for a go. / " + won + " | 120-121 122-0 | 0 | 0 | You won 121 to 0: a double skunk, 4 games. Click New to play again.";
     QTest::newRow("user wins on the first count") << runsTo31 << false << "you=115 2S 8D TH QC ok all"
-        << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / " + won + " | 116-121 0-2 | none | 0";
+        << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / " + won + " | 116-121 0-2 | none | 0 | You won 121 to 2: a double skunk, 4 games. Click New to play again.";
     QTest::newRow("computer wins on the first count") << lastCardGo << true << "opp=110 AS AH 6D QH ok all"
         << "You peg 1 for a go. / Opponent pegs 12 for his hand. / You lost. / Please click New to play again. "
-           "| 0-1 110-121 | none | 0";
+           "| 0-1 110-121 | none | 0 | You lost 1 to 121: a double skunk, 4 games. Click New to play again.";
 }
 
 void PlayTest::deal()
@@ -223,8 +224,8 @@ void PlayTest::deal()
     // The count as shown, which is always the real one; none in the show.
     const QString count = r.countVisible ? QString::number(r.shownCount) : QStringLiteral("none");
     QCOMPARE(r.countVisible ? r.shownCount : 0, r.runningCount);
-    QCOMPARE(QStringList({LogLines(b).mid(mark).join(" / "), pegs, count,
-                          QString::number(ShownButtons(b).value(0))}).join(" | "), expected);
+    QCOMPARE(QStringList({LogLines(b).mid(mark).join(" / "), pegs, count, QString::number(ShownButtons(b).value(0)),
+                          b.StatusLine().section(QStringLiteral(" \u00b7 "), -1)}).join(" | "), expected);
 }
 
 VENNICK_TEST(PlayTest);
