@@ -5,6 +5,7 @@
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
 
+#include <QCheckBox>
 #include <QDialogButtonBox>
 #include <QHelpEvent>
 #include <QLabel>
@@ -146,7 +147,8 @@ private slots:
     {
         QTest::addColumn<int>("item");       // in the Tools menu: About 0, Options 1
         QTest::addColumn<int>("stored");     // the style in the store
-        QTest::addColumn<QString>("steps");  // a digit clicks that style; d, u: arrow down, up
+        // A digit clicks that style; d, u: arrow down, up; e: Alt+E, which turns "Explain each score" over.
+        QTest::addColumn<QString>("steps");
         QTest::addColumn<int>("end");        // Enter, Escape, or a click on OK with Enter held
         // The title and labels; the style selected and "f" on the focus, as
         // opened and after each step; the style afterwards, and whether saved.
@@ -154,8 +156,8 @@ private slots:
         const int ok = QDialogButtonBox::Ok, enter = Qt::Key_Return, escape = Qt::Key_Escape;
         const QString about = "About Vennick: 32 Vennick > 2", options = "Options: Normal Wooden Embossed ";
         QTest::newRow("About, Enter") << 0 << 2 << "" << enter << about;
-        QTest::newRow("Wooden; Embossed, OK") << 1 << 2 << "3" << ok << options + "2f 3f > 3 saved";
-        QTest::newRow("Wooden; Embossed, Escape") << 1 << 2 << "3" << escape << options + "2f 3f > 2";
+        QTest::newRow("Wooden; Embossed, explained, OK") << 1 << 2 << "3e" << ok << options + "2f 3f 3 > 3 explained saved";
+        QTest::newRow("Wooden; Embossed, explained, Escape") << 1 << 2 << "3e" << escape << options + "2f 3f 3 > 2";
         QTest::newRow("Embossed; down round to Normal, up round back, Enter") << 1 << 3 << "du" << enter << options + "3f 1f 3f > 3 saved";
         // A damaged style selects no button; confirmed untouched, it is kept.
         QTest::newRow("7; Enter keeps it") << 1 << 7 << "" << enter << options + " > 7 saved";
@@ -202,7 +204,10 @@ private slots:
             for (const QChar k : options ? QStringLiteral("-") + steps : QString()) {
                 if (k.isDigit())
                     QTest::mouseClick(options->StyleButton(kStyleButtonNormal + k.digitValue() - 1), Qt::LeftButton);
-                else if (k != u'-')
+                else if (k == u'e') {
+                    QTest::keyClick(dialog.windowHandle(), Qt::Key_E, Qt::AltModifier);  // through the shortcuts
+                    QTRY_VERIFY(options->ExplainBox()->isChecked());  // a mnemonic clicks after a moment
+                } else if (k != u'-')
                     QTest::keyClick(dialog.focusWidget(), k == u'd' ? Qt::Key_Down : Qt::Key_Up);
                 trace += ' ';
                 for (int s = 1; s <= 3; ++s) {
@@ -219,7 +224,8 @@ private slots:
         QTest::keyRelease(&board, byKey ? Qt::Key(end) : Qt::Key_Return);
         QTest::qWait(60);
         const QSettings settings(QStringLiteral("Quorvan"), QStringLiteral("Vennick"));
-        trace += QStringLiteral(" > %1").arg(board.record.boardStyle) + (settings.value("Board").toInt() == 9 ? "" : " saved");
+        trace += QStringLiteral(" > %1").arg(board.record.boardStyle) + (board.record.explainScores ? " explained" : "")
+                 + (settings.value("Board").toInt() == 9 ? "" : " saved");
         QCOMPARE(trace, expected);
         QVERIFY(HoldsBoard(board, board.record.boardStyle));
         QCOMPARE(LogLines(board), lines);
