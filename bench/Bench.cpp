@@ -1,10 +1,12 @@
 // Figures for the hand counter and the play scorer: every hand of four with a
-// starter counted under both rules (score table, totals, means, agreement with
-// the plain reference counter, time per count), then the time per play score
-// over a fixed set of random plays and the agreement of the play scorer with
-// its reference over every play the game can make; then the computer's
+// starter counted under both rules (score table, totals, means, agreement of
+// the counter and of the reasons with the plain reference counter, time per
+// count and per itemised hand), then the time per play score over a fixed set
+// of random plays and the agreement of the play scorer and its reasons with
+// the reference over every play the game can make; then the computer's
 // decisions and whole games (bench/GameBench.cpp). Times are printed, never
-// judged; the exit status is 1 only if a counter disagrees with its reference.
+// judged; the exit status is 1 only if a counter or its reasons disagree with
+// the reference.
 // Needs no display. From the source folder:
 //   cmake -S . -B build/release -G Ninja -DCMAKE_BUILD_TYPE=Release
 //   cmake --build build/release --target vennick_bench
@@ -12,8 +14,10 @@
 
 #include "bench/GameBench.h"
 #include "bench/Timing.h"
+#include "play/PlayReasons.h"
 #include "play/PlaySequence.h"
 #include "scoring/HandCount.h"
+#include "scoring/ScoreReasons.h"
 #include "tests/play/ReferencePlay.h"
 #include "tests/scoring/ReferenceCount.h"
 
@@ -29,13 +33,18 @@ constexpr int kRepetitions = 7;
 constexpr int kMaxScore = 29;
 constexpr long long kHands = 12994800;
 constexpr int kPlays = 1000000;
+// The reasons are timed on every 97th hand, as the tests sample them.
+constexpr long long kItemiseEvery = 97;
 
 struct RuleFigures {
     std::array<long long, kMaxScore + 2> hands{};  // the last slot: anything above 29
     long long totalPoints = 0;
     long long disagreements = 0;
+    long long reasonDisagreements = 0;
     double nanosecondsPerCount = 0;
+    double nanosecondsPerItemise = 0;
     long long checksum = 0;
+    long long reasonCharacters = 0;
 };
 
 RuleFigures CountEveryHand(bool cribRule)
@@ -45,8 +54,11 @@ RuleFigures CountEveryHand(bool cribRule)
         const int points = CountHandCards(cards, cribRule);
         ++figures.hands[static_cast<size_t>(std::clamp(points, 0, kMaxScore + 1))];
         figures.totalPoints += points;
-        if (points != ReferenceCountHand(cards, cribRule))
+        const int reference = ReferenceCountHand(cards, cribRule);
+        if (points != reference)
             ++figures.disagreements;
+        if (ItemsTotal(ItemiseHand(cards, cribRule)) != reference)
+            ++figures.reasonDisagreements;
     });
 
     std::vector<double> times;
@@ -58,6 +70,24 @@ RuleFigures CountEveryHand(bool cribRule)
         figures.checksum = sum;
     }
     figures.nanosecondsPerCount = Median(times);
+
+    // A reasons line as the log writes it: the reasons and their text.
+    std::vector<std::array<CardId, 5>> sample;
+    long long hands = 0;
+    ForEveryHand([&](const CardId* cards) {
+        if (hands++ % kItemiseEvery == 0)
+            sample.push_back({cards[0], cards[1], cards[2], cards[3], cards[4]});
+    });
+    times.clear();
+    for (int repetition = 0; repetition < kRepetitions; ++repetition) {
+        long long characters = 0;
+        const double start = ThreadSeconds();
+        for (const auto& cards : sample)
+            characters += ReasonsLine(ItemiseHand(cards.data(), cribRule)).size();
+        times.push_back((ThreadSeconds() - start) * 1e9 / static_cast<double>(sample.size()));
+        figures.reasonCharacters = characters;
+    }
+    figures.nanosecondsPerItemise = Median(times);
     return figures;
 }
 
@@ -111,15 +141,25 @@ int main(int argc, char** argv)
                 static_cast<double>(crib.totalPoints) / kHands);
     std::printf("\nDisagreements with the reference counter: hand rule %lld, crib rule %lld\n",
                 hand.disagreements, crib.disagreements);
+    std::printf("Reasons whose points differ from it: hand rule %lld, crib rule %lld\n", hand.reasonDisagreements,
+                crib.reasonDisagreements);
     std::printf("Time per count (median of %d passes over every hand): hand rule %.2f ns, crib rule %.2f ns\n",
                 kRepetitions, hand.nanosecondsPerCount, crib.nanosecondsPerCount);
-    std::printf("(checksums %lld %lld)\n", hand.checksum, crib.checksum);
+    std::printf("Time per reasons line, ItemiseHand and ReasonsLine (median of %d passes over every %lldth hand): "
+                "hand rule %.0f ns, crib rule %.0f ns\n",
+                kRepetitions, kItemiseEvery, hand.nanosecondsPerItemise, crib.nanosecondsPerItemise);
+    std::printf("(checksums %lld %lld; characters of reasons %lld %lld)\n", hand.checksum, crib.checksum,
+                hand.reasonCharacters, crib.reasonCharacters);
 
     std::printf("\nPlay scorer: %d random legal plays of 1 to 8 cards\n", kPlays);
     const std::vector<PlaySequence> plays = RandomPlays();
     long long randomDisagreements = 0;
-    for (const PlaySequence& play : plays)
-        randomDisagreements += ScorePlay(play) != ReferenceScorePlay(play) ? 1 : 0;
+    long long randomReasonDisagreements = 0;
+    for (const PlaySequence& play : plays) {
+        const int reference = ReferenceScorePlay(play);
+        randomDisagreements += ScorePlay(play) != reference ? 1 : 0;
+        randomReasonDisagreements += ItemsTotal(ItemisePlay(play)) != reference ? 1 : 0;
+    }
     std::vector<double> times;
     long long sum = 0;
     for (int repetition = 0; repetition < kRepetitions; ++repetition) {
@@ -134,16 +174,22 @@ int main(int argc, char** argv)
 
     long long visited = 0;
     long long everyDisagreements = 0;
+    long long everyReasonDisagreements = 0;
     ForEveryLegalPlay(8, [&](const PlaySequence& sequence) {
         ++visited;
-        everyDisagreements += ScorePlay(sequence) != ReferenceScorePlay(sequence) ? 1 : 0;
+        const int reference = ReferenceScorePlay(sequence);
+        everyDisagreements += ScorePlay(sequence) != reference ? 1 : 0;
+        everyReasonDisagreements += ItemsTotal(ItemisePlay(sequence)) != reference ? 1 : 0;
     });
     std::printf("Disagreements with the reference scorer: %lld of the random plays, %lld of all %lld legal plays\n",
                 randomDisagreements, everyDisagreements, visited);
+    std::printf("Reasons whose points differ from it: %lld of the random plays, %lld of all legal plays\n",
+                randomReasonDisagreements, everyReasonDisagreements);
 
     RunGameBench(argc, argv);
 
     const bool agreed = hand.disagreements == 0 && crib.disagreements == 0 && randomDisagreements == 0
-        && everyDisagreements == 0;
+        && everyDisagreements == 0 && hand.reasonDisagreements == 0 && crib.reasonDisagreements == 0
+        && randomReasonDisagreements == 0 && everyReasonDisagreements == 0;
     return agreed ? 0 : 1;
 }

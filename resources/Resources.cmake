@@ -33,3 +33,9 @@ qt_add_resources(vennick_core vennick_icons
     PREFIX /icons
     BASE ${VENNICK_GENERATED_DIR}/icons
     FILES ${VENNICK_ICON_FILES})
+
+# How to Play, shown by Help as ":/help/how-to-play.html".
+qt_add_resources(vennick_core vennick_help
+    PREFIX /help
+    BASE ${CMAKE_CURRENT_LIST_DIR}
+    FILES ${CMAKE_CURRENT_LIST_DIR}/how-to-play.html)

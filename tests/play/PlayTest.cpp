@@ -1,3 +1,4 @@
+#include "play/PlayReasons.h"
 #include "play/PlaySequence.h"
 #include "play/ReferencePlay.h"
 #include "support/TestBoard.h"
@@ -8,8 +9,8 @@
 #include <cstdlib>
 
 // The play and the show: deals played through the window, the computer's two
-// decisions on hands laid out to show its rules, and the play scorer against
-// the plain reference.
+// decisions on hands laid out to show its rules, and the play scorer and its
+// reasons against the plain reference.
 class PlayTest : public QObject {
     Q_OBJECT
 
@@ -99,12 +100,37 @@ private slots:
             PlaySequence rebuilt;  // the same cards appended one by one
             for (int i = 0; i < SequenceLength(sequence); ++i)
                 SequenceAppend(rebuilt, sequence.entries[i]);
-            if (first.isEmpty() && (ScorePlay(rebuilt) != ReferenceScorePlay(sequence) || rebuilt.entries[8] != -1))
+            const int points = ReferenceScorePlay(sequence);
+            if (first.isEmpty()
+                && (ScorePlay(rebuilt) != points || rebuilt.entries[8] != -1 || ItemsTotal(ItemisePlay(sequence)) != points))
                 for (int entry : sequence.entries)
                     first += QString::number(entry) + QLatin1Char(' ');
         });
         QVERIFY2(first.isEmpty(), qPrintable(first));
         QCOMPARE(visited, everything ? 12892167LL : 182587LL);
+    }
+
+    // The names and their order, which the totals above cannot see.
+    void playReasons_data()
+    {
+        QTest::addColumn<QList<int>>("laid");  // rank1 of each card since the count began
+        QTest::addColumn<QString>("expected");
+
+        QTest::newRow("a run laid out of order, making fifteen") << QList<int>{4, 6, 5} << "fifteen 2, a run of three 5";
+        QTest::newRow("thirty-one and a run") << QList<int>{13, 8, 6, 7} << "thirty-one 2, a run of three 5";
+        QTest::newRow("three of a kind making fifteen") << QList<int>{5, 5, 5} << "fifteen 2, three of a kind 8";
+        QTest::newRow("four of a kind after another card") << QList<int>{1, 2, 2, 2, 2} << "four of a kind 12";
+        QTest::newRow("a run of seven") << QList<int>{7, 6, 5, 4, 3, 1, 2} << "a run of seven 7";
+    }
+
+    void playReasons()
+    {
+        QFETCH(QList<int>, laid);
+        QFETCH(QString, expected);
+        PlaySequence sequence;
+        for (int rank1 : laid)
+            SequenceAppend(sequence, rank1);
+        QCOMPARE(ReasonsLine(ItemisePlay(sequence)), expected);
     }
 };
 
