@@ -2,6 +2,7 @@
 
 #include "game/GameRecord.h"
 #include "presentation/ImageHolder.h"
+#include "scoring/ScoreReasons.h"
 
 #include <QBasicTimer>
 #include <QHash>
@@ -75,6 +76,8 @@ public:
 
     // --- game/: message log
     void LogMessage(const QString& text);
+    // The reasons of a score in a line of their own, when "Explain each score" is on.
+    void LogReasons(const QList<ScoreItem>& reasons);
     QListWidget* MessageLog() const { return messageLog; }
 
     // --- game/: score track and pegs
@@ -92,10 +95,13 @@ public:
 
     // --- scoring/
     int CountHand(const CardId cards[5]) const;
+    // The reasons of the same count, under the same rule.
+    QList<ScoreItem> HandReasons(const CardId cards[5]) const;
     void ScorePlayerHand();
     void ScoreOpponentHand();
     void ScoreCrib();
-    void PegPoints(int side, int points, const QString& suffix);
+    // With "Explain each score" on, the reasons follow the announcement in a line of their own.
+    void PegPoints(int side, int points, const QString& suffix, const QList<ScoreItem>& reasons = {});
     // Games a win adds to the tally: 1, 2 when the loser has 90 or less, 4 when 60 or less.
     static int32_t GamesForWin(int loserScore);
 

@@ -14,3 +14,9 @@ void GameBoard::LogMessage(const QString& text)
     messageLog->scrollToBottom();
     NoteStatusChange();
 }
+
+void GameBoard::LogReasons(const QList<ScoreItem>& reasons)
+{
+    if (record.explainScores != 0 && !reasons.isEmpty())
+        LogMessage(ReasonsLine(reasons));
+}

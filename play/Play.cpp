@@ -1,4 +1,5 @@
 #include "game/GameBoard.h"
+#include "play/PlayReasons.h"
 #include "play/PlaySequence.h"
 
 namespace {
@@ -67,7 +68,7 @@ void GameBoard::PlayerPlaysCard(int rank1)
     record.runningCount += Rank1Value(rank1);
     record.lastToPlay = kSidePlayer;
     SequenceAppend(record.playSequence, rank1);
-    PegPoints(kSidePlayer, ScorePlay(record.playSequence), QString());
+    PegPoints(kSidePlayer, ScorePlay(record.playSequence), QString(), ItemisePlay(record.playSequence));
     RefreshCount();
     if (record.runningCount == kMaxCount)
         ResetCount();
@@ -135,7 +136,7 @@ void GameBoard::ComputerPlaysCard(int rank1)
     SequenceAppend(record.playSequence, rank1);
     record.lastToPlay = kSideOpponent;
     RefreshCount();
-    PegPoints(kSideOpponent, ScorePlay(record.playSequence), QString());
+    PegPoints(kSideOpponent, ScorePlay(record.playSequence), QString(), ItemisePlay(record.playSequence));
 }
 
 bool GameBoard::PlayerCannotPlay() const

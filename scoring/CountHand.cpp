@@ -7,3 +7,8 @@ int GameBoard::CountHand(const CardId cards[5]) const
 {
     return CountHandCards(cards, record.phase == kPhaseCribCounted);
 }
+
+QList<ScoreItem> GameBoard::HandReasons(const CardId cards[5]) const
+{
+    return ItemiseHand(cards, record.phase == kPhaseCribCounted);
+}

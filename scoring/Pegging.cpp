@@ -30,7 +30,7 @@ int32_t GameBoard::GamesForWin(int loserScore)
     return games;
 }
 
-void GameBoard::PegPoints(int side, int points, const QString& suffix)
+void GameBoard::PegPoints(int side, int points, const QString& suffix, const QList<ScoreItem>& reasons)
 {
     const QString announced = (side == kSidePlayer ? QStringLiteral("You peg ") : QStringLiteral("Opponent pegs "))
         + QString::number(points) + suffix + QLatin1Char('.');
@@ -43,12 +43,14 @@ void GameBoard::PegPoints(int side, int points, const QString& suffix)
     } else if (side == kSidePlayer) {
         MovePlayerPegs(points);
         LogMessage(announced);
+        LogReasons(reasons);
         // The computer waits until the user has seen the points.
         if (record.phase < kPhaseCountStart)
             ShowOk();
     } else {
         MoveOpponentPegs(points);
         LogMessage(announced);
+        LogReasons(reasons);
         if (record.phase < kPhaseCountStart && PlayerCannotPlay()) {
             if (!ComputerCannotPlay()) {
                 ShowOk();

@@ -15,7 +15,7 @@ void ScoreHand(GameBoard& board, int side, int firstSlot, const QString& suffix,
     GameRecord& r = board.record;
     const CardId* hand = r.deal + firstSlot;
     const CardId cards[5] = {hand[0], hand[1], hand[2], hand[3], r.deal[12]};
-    board.PegPoints(side, board.CountHand(cards), suffix);
+    board.PegPoints(side, board.CountHand(cards), suffix, board.HandReasons(cards));
     if (!GameWon(board)) {
         if (r.phase == kPhaseHandCounted)
             board.ShowScoreCrib();
@@ -56,7 +56,7 @@ void GameBoard::ScoreCrib()
         Invalidate(otherRow[i].rect);
     }
 
-    PegPoints(playersCrib ? kSidePlayer : kSideOpponent, points, QStringLiteral(" for the crib"));
+    PegPoints(playersCrib ? kSidePlayer : kSideOpponent, points, QStringLiteral(" for the crib"), HandReasons(cards));
     SetButtonShown(ActionButton(kCmdScoreCrib), false);
     if (!GameWon(*this))
         SetButtonShown(ActionButton(kCmdDeal), true);

@@ -183,6 +183,13 @@ void PlayTest::deal_data()
         << "AS AH 6D QH AD 3D 4S 2S 2C 4H 7D QD JD" << true << "ok" << "You peg 2 for His Heels. | 0-2 122-0 | 4 | 0 | Your turn";
     QTest::newRow("His Heels for the computer; the user leads")
         << "2S 8D TH QC AD 4D KS KD 6H 5S 9D KC JH" << false << "2S" << "Opponent pegs 2 for His Heels. | 122-0 0-2 | 12 | 0 | Your turn";
+    // Explain each score: the reasons follow each count above 0, but not a go or His Heels.
+    QTest::newRow("explained: the play") << "AC 7C TD JD 2H 3H 8H JS QS TS 4D 5D 6C" << false << "explain AC 7C TD JD ok"
+        << "Opponent pegs 1 for a go. / Opponent pegs 2. / a pair 2 / You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 3-4 | none | 4 | Score your hand";
+    QTest::newRow("explained: the show") << runsTo31 << false << "explain 2S 8D TH QC ok ok ok"
+        << "Opponent pegs 2. / thirty-one 2 / You peg 1 for a go. / You peg 6 for your hand. / fifteen 2, fifteen 4, fifteen 6 / "
+           "Opponent pegs 12 for his hand. / fifteen 2, fifteen 4, fifteen 6, fifteen 8, a pair 10, a pair 12 / "
+           "Opponent pegs 6 for the crib. / fifteen 2, fifteen 4, fifteen 6 | 1-7 14-20 | none | 1 | Click Deal for the next hand";
     // The show: the non-dealer's hand, the dealer's, then the crib.
     QTest::newRow("show after the computer's deal") << runsTo31 << false << "2S 8D TH QC ok ok ok"
         << "Opponent pegs 2. / You peg 1 for a go. / You peg 6 for your hand. / Opponent pegs 12 for his hand. / "
@@ -233,6 +240,10 @@ void PlayTest::deal()
 
     for (const QString& step : script.split(' ', Qt::SkipEmptyParts)) {
         const int n = step.mid(4).toInt();
+        if (step == "explain") {
+            r.explainScores = 1;
+            continue;
+        }
         if (step == "ok" || step == "ret" || step == "all" || step.contains('=')) {
             for (int p = 1; step == "all" && p <= 6; ++p) {
                 TapHand(b, p);

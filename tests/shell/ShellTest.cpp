@@ -1,6 +1,7 @@
 #include "settings/OptionsDialog.h"
 #include "settings/TempStore.h"
 #include "shell/GameApp.h"
+#include "shell/HowToPlay.h"
 #include "shell/MainFrame.h"
 #include "support/TestBoard.h"
 #include "support/TestMain.h"
@@ -15,6 +16,7 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QScreen>
+#include <QTextBrowser>
 #include <QTimer>
 #include <QToolTip>
 
@@ -109,6 +111,11 @@ private slots:
             QCOMPARE(board.record.phase, int(kPhaseNoDeal));
             QCOMPARE(LogLines(board).first(), board.record.ownerName + (byKey ? ": 0" : ": 4"));
         }
+        // F1 opens the rules beside the game, which goes on meanwhile.
+        QTest::keyClick(frame, Qt::Key_F1);
+        QVERIFY(frame->HowToPlay() && !frame->HowToPlay()->isHidden() && !QApplication::activeModalWidget());
+        QVERIFY(frame->HowToPlay()->Browser()->toPlainText().contains(QStringLiteral("His Heels")));
+        frame->HowToPlay()->close();
         // Ctrl+Q ends the program's own loop; 7 should nothing end it within five seconds.
         QTimer::singleShot(0, frame, [frame] { QTest::keyClick(frame, Qt::Key_Q, Qt::ControlModifier); });
         QTimer::singleShot(5000, frame, [] { QCoreApplication::exit(7); });
