@@ -156,8 +156,9 @@ void GameBoard::CreateActionButtons()
     messageLog->setObjectName(QStringLiteral("MessageLog"));
     messageLog->setFocusPolicy(Qt::NoFocus);
     messageLog->setSelectionMode(QAbstractItemView::NoSelection);
-    // Every line is one line of text: the list need not measure them one by one.
-    messageLog->setUniformItemSizes(true);
+    // A line longer than the list is wide (a long reasons line, a path) wraps
+    // rather than being cut off.
+    messageLog->setWordWrap(true);
     messageLog->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
     messageLog->setFont(font);
     messageLog->setGeometry(ScaledRect(LogRect()));
