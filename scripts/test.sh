@@ -25,3 +25,5 @@ appstreamcli validate --no-net "$prefix/share/metainfo/org.quorvan.Vennick.metai
 for icon in "$prefix"/share/icons/hicolor/*/apps; do
     test -f "$icon/org.quorvan.Vennick.png"
 done
+
+bash scripts/check-package.sh

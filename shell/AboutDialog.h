@@ -2,7 +2,7 @@
 
 #include <QDialog>
 
-// The About box: the program's icon, its name and an OK button.
+// The About box: the program's icon, its name, version and licence, and an OK button.
 class CAboutDlg : public QDialog {
     Q_OBJECT
 

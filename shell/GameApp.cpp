@@ -9,6 +9,8 @@ CGameApp::CGameApp(int& argc, char** argv)
 {
     setApplicationName(QStringLiteral("Vennick"));
     setOrganizationName(QStringLiteral("Quorvan"));
+    // The project's version, from the build (CMake's project()).
+    setApplicationVersion(QStringLiteral(VENNICK_VERSION));
     QIcon icon;
     for (int size : {16, 32, 256})
         icon.addFile(QStringLiteral(":/icons/vennick-%1.png").arg(size), QSize(size, size));

@@ -161,7 +161,9 @@ private slots:
         // opened and after each step; the style afterwards, and whether saved.
         QTest::addColumn<QString>("expected");
         const int ok = QDialogButtonBox::Ok, enter = Qt::Key_Return, escape = Qt::Key_Escape;
-        const QString about = "About Vennick: 32 Vennick > 2", options = "Options: Normal Wooden Embossed ";
+        // The version is the one the build gives --version.
+        const QString about = "About Vennick: 32 Vennick Version " VENNICK_VERSION " Free software under the MIT licence. > 2";
+        const QString options = "Options: Normal Wooden Embossed ";
         QTest::newRow("About, Enter") << 0 << 2 << "" << enter << about;
         QTest::newRow("Wooden; Embossed, explained, OK") << 1 << 2 << "3e" << ok << options + "2f 3f 3 > 3 explained saved";
         QTest::newRow("Wooden; Embossed, explained, Escape") << 1 << 2 << "3e" << escape << options + "2f 3f 3 > 2";
@@ -198,9 +200,10 @@ private slots:
             QDialog& dialog = *qobject_cast<QDialog*>(QApplication::activeModalWidget());
             QTimer::singleShot(2000, &dialog, &QDialog::reject);  // left open, it cannot hang the run
             trace = dialog.windowTitle() + ':';
-            QRect before;  // each label right of the one before, all above the buttons
+            QRect before;  // each label right of the one before or below it, all above the buttons
             for (const QLabel* label : dialog.findChildren<QLabel*>()) {
-                const bool placed = label->x() > before.right() && label->geometry().bottom() < dialog.findChild<QDialogButtonBox*>()->y();
+                const bool placed = (label->x() > before.right() || label->y() > before.bottom())
+                                    && label->geometry().bottom() < dialog.findChild<QDialogButtonBox*>()->y();
                 trace += ' ' + (label->pixmap().isNull() ? label->text() : QString::number(label->pixmap().width()))
                          + (placed ? "" : " misplaced");
                 before = label->geometry();
