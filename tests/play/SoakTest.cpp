@@ -6,12 +6,66 @@
 #include <QScrollBar>
 #include <QtTest>
 
+#include <condition_variable>
+#include <mutex>
 #include <random>
+#include <stop_token>
+#include <thread>
 
 namespace {
 
+using namespace std::chrono_literals;
+
 constexpr int kGamesPerRound = 500;
-constexpr int kActionsPerGameLimit = 20000;  // a game takes a few hundred: far more is a game stuck
+// A game takes a few hundred actions and well under a second, even under the
+// sanitizers: far more of either is a game stuck.
+constexpr int kActionsPerGameLimit = 20000;
+constexpr auto kGameTimeLimit = 60s;
+
+int SoakGames()
+{
+    const int asked = qEnvironmentVariableIntValue("VENNICK_SOAK_GAMES");
+    return asked > 0 ? asked : 300;
+}
+
+// Qt 6.4's limit per test function is not one per data row: its watchdog can
+// keep the deadline of an earlier row, so the rounds may share one limit. The
+// whole soak is allowed a second a game; the game clock below stops a stuck game.
+const bool soakTimeAllowed = AllowFunctionTime(SoakGames() * std::chrono::milliseconds(1s));
+
+// Ends the run when one game has taken longer than kGameTimeLimit, also a game
+// stuck inside one action, which never comes back to count its actions.
+class GameClock {
+public:
+    void Start(QString game)
+    {
+        const std::scoped_lock lock(mutex);
+        deadline = Clock::now() + kGameTimeLimit;
+        name = std::move(game);
+        wake.notify_all();
+    }
+
+private:
+    using Clock = std::chrono::steady_clock;
+
+    void Watch(std::stop_token stop)
+    {
+        std::unique_lock lock(mutex);
+        while (!stop.stop_requested()) {
+            if (Clock::now() >= deadline)
+                qFatal("%s has run for more than %lld s: stuck", qPrintable(name),
+                       static_cast<long long>(kGameTimeLimit.count()));
+            // Until this deadline passes or another takes its place.
+            wake.wait_until(lock, stop, deadline, [this, until = deadline] { return deadline != until; });
+        }
+    }
+
+    std::mutex mutex;
+    std::condition_variable_any wake;
+    Clock::time_point deadline = Clock::time_point::max();
+    QString name;
+    std::jthread watcher{[this](std::stop_token stop) { Watch(stop); }};  // last: the rest exists first
+};
 
 bool Shows(const CardSprite& sprite, CardId card)
 {
@@ -23,8 +77,7 @@ bool Shows(const CardSprite& sprite, CardId card)
 // Whole games against the computer, from the first deal to 121, by a scripted
 // user who makes random legal moves with random nonsense mixed in, and the
 // table checked after every action. VENNICK_SOAK_GAMES raises the count; the
-// games are played in rounds, one data row each, so that Qt Test's limit per
-// test function applies to a round, not to the whole run.
+// games are played in rounds of 500, one data row each.
 class SoakTest : public QObject {
     Q_OBJECT
 
@@ -33,8 +86,7 @@ private slots:
     void wholeGames_data()
     {
         QTest::addColumn<int>("games");
-        const int asked = qEnvironmentVariableIntValue("VENNICK_SOAK_GAMES");
-        for (int left = asked > 0 ? asked : 300, round = 1; left > 0; left -= kGamesPerRound, ++round)
+        for (int left = SoakGames(), round = 1; left > 0; left -= kGamesPerRound, ++round)
             QTest::addRow("round %d", round) << std::min(left, kGamesPerRound);
     }
     void wholeGames();
@@ -151,12 +203,14 @@ private:
     bool ended = false;
     int lastYou = 0, lastOpponent = 0;
     int32_t tallyFor = 0, tallyAgainst = 0;
+    GameClock clock;
 };
 
 void SoakTest::wholeGames()
 {
     QFETCH(int, games);
     for (int finished = 0, actions = 0; finished < games; actions = 0) {
+        clock.Start(QStringLiteral("%1, game %2").arg(QString::fromLatin1(QTest::currentDataTag())).arg(finished));
         bool abandoned = false;
         while (!ended && !abandoned) {
             QVERIFY2(++actions < kActionsPerGameLimit, "a game never ends");

@@ -5,10 +5,13 @@
 #include <QSettings>
 #include <QTemporaryDir>
 
+#include <algorithm>
+#include <climits>
 #include <vector>
 
-// Constant-initialised, so it exists before any test file registers.
+// Constant-initialised, so they exist before any test file registers.
 constinit static std::vector<std::function<int(int, char**)>> registry;
+constinit static std::chrono::milliseconds functionTimeAllowed{0};
 
 bool RegisterTestClass(std::function<int(int, char**)> run)
 {
@@ -16,8 +19,19 @@ bool RegisterTestClass(std::function<int(int, char**)> run)
     return true;
 }
 
+bool AllowFunctionTime(std::chrono::milliseconds limit)
+{
+    functionTimeAllowed = std::max(functionTimeAllowed, limit);
+    return true;
+}
+
 int main(int argc, char** argv)
 {
+    // Qt Test reads its limit once, at the first test function of the run.
+    constexpr std::chrono::milliseconds kQtTestLimit = std::chrono::minutes(5);
+    if (functionTimeAllowed > kQtTestLimit && !qEnvironmentVariableIsSet("QTEST_FUNCTION_TIMEOUT"))
+        qputenv("QTEST_FUNCTION_TIMEOUT", QByteArray::number(std::min<qint64>(functionTimeAllowed.count(), INT_MAX)));
+
     // Settings never touch the user's own: the whole run uses a fresh folder.
     QTemporaryDir configHome;
     qputenv("XDG_CONFIG_HOME", configHome.path().toUtf8());
