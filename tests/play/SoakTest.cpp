@@ -11,6 +11,7 @@
 #include <random>
 #include <stop_token>
 #include <thread>
+#include <utility>
 
 namespace {
 
@@ -82,7 +83,15 @@ class SoakTest : public QObject {
     Q_OBJECT
 
 private slots:
-    void initTestCase() { b.randomSource = [this]() { return static_cast<int>(rng() >> 1); }; }
+    void initTestCase()
+    {
+        b.randomSource = [this]() { return static_cast<int>(rng() >> 1); };
+        connect(b.MessageLog()->model(), &QAbstractItemModel::rowsInserted, this,
+                [this](const QModelIndex&, int first, int last) {
+                    for (int i = first; i <= last; ++i)
+                        SeePlay(b.MessageLog()->item(i)->text());
+                });
+    }
     void wholeGames_data()
     {
         QTest::addColumn<int>("games");
@@ -146,8 +155,66 @@ private:
             return "running count differs from the cards of the count";
         if (ShownButtons(b).size() > 1)
             return "two buttons shown at once";
-        const QString broken = CheckCards();
-        return broken.isEmpty() ? CheckGameEnd() : broken;
+        for (const QString& broken : {CheckTurns(), CheckCards()})
+            if (!broken.isEmpty())
+                return broken;
+        return CheckGameEnd();
+    }
+
+    // Whether a side holds a card (hand places 1 to 4) that fits the count.
+    bool CanLay(int side) const
+    {
+        const CardSprite* hand = side == kSidePlayer ? r.playerHandSprites : r.opponentHandSprites;
+        const CardId* cards = r.deal + (side == kSidePlayer ? 0 : 6);
+        for (int p = 1; p <= 4; ++p)
+            if (hand[p].suit1 != kSuitEmpty && r.runningCount + CardValue(cards[p]) <= 31)
+                return true;
+        return false;
+    }
+
+    // What the play showed when last seen (at a log line or at rest).
+    struct PlaySeen {
+        int32_t phase = kPhaseNoDeal;
+        int laid = 0;  // cards in both piles
+        int32_t count = 0;
+        bool cardFits = false;  // a card of either hand fits the count
+    };
+
+    // At each log line and at rest: the computer says "Go" only when no card
+    // of its hand fits, and a count below 31 starts again only when no card
+    // of either hand fits it (a go), whenever the change is announced.
+    void SeePlay(const QString& line)
+    {
+        PlaySeen now{r.phase, 0, r.runningCount, CanLay(kSidePlayer) || CanLay(kSideOpponent)};
+        for (int i = 0; i < 4; ++i)
+            now.laid += (r.playerPileSprites[i].suit1 != kSuitEmpty) + (r.opponentPileSprites[i].suit1 != kSuitEmpty);
+        if (turnBroken.isEmpty() && line == QStringLiteral("Opponent says: 'Go'") && CanLay(kSideOpponent))
+            turnBroken = QStringLiteral("the computer said Go at %1 with a card that fits").arg(r.runningCount);
+        if (turnBroken.isEmpty() && seen.phase == kPhasePlay && seen.count > 0 && seen.count < 31 && seen.cardFits
+            && now.count == 0 && now.laid == seen.laid)
+            turnBroken = QStringLiteral("the count started again after %1 with a card that fits").arg(seen.count);
+        seen = now;
+    }
+
+    // The turns of the play at rest: the user, when to lay a card, has one
+    // that fits; the computer, when it laid none on the user's card, has none;
+    // the play ends with both hands laid.
+    QString CheckTurns()
+    {
+        SeePlay(QString());
+        if (!turnBroken.isEmpty() || r.gameOver)
+            return std::exchange(turnBroken, QString());
+        if (r.phase == kPhasePlay && ShownButtons(b).isEmpty()) {
+            if (!CanLay(kSidePlayer))
+                return "the user is to lay a card, but none fits";
+            if (r.lastToPlay == kSidePlayer && r.playSequence.entries[0] != -1 && CanLay(kSideOpponent))
+                return QStringLiteral("the computer let the turn pass at %1 with a card that fits").arg(r.runningCount);
+        }
+        const bool playOver = r.phase == kPhasePlayOver || r.phase == kPhaseHandCounted || r.phase == kPhaseCribCounted;
+        for (int p = 1; playOver && p <= 4; ++p)
+            if (r.playerHandSprites[p].suit1 != kSuitEmpty || r.opponentHandSprites[p].suit1 != kSuitEmpty)
+                return "the play ended with a card still in a hand";
+        return {};
     }
 
     // Every card face shown is the card dealt to that place; a card laid is
@@ -203,6 +270,9 @@ private:
     bool ended = false;
     int lastYou = 0, lastOpponent = 0;
     int32_t tallyFor = 0, tallyAgainst = 0;
+    // The play when last seen, and the first rule of its turns broken.
+    PlaySeen seen;
+    QString turnBroken;
     GameClock clock;
 };
 
