@@ -153,6 +153,9 @@ private:
             total += Rank1Value(r.playSequence.entries[i]);
         if (total != r.runningCount || total > 31)
             return "running count differs from the cards of the count";
+        const bool show = r.phase == kPhasePlayOver || r.phase == kPhaseHandCounted || r.phase == kPhaseCribCounted;
+        if ((r.countVisible && r.shownCount != r.runningCount) || (show && r.countVisible) || (r.phase == kPhasePlay && !r.countVisible))
+            return "the count shown is not the real one";
         if (ShownButtons(b).size() > 1)
             return "two buttons shown at once";
         for (const QString& broken : {CheckTurns(), CheckCards()})
