@@ -148,6 +148,15 @@ private:
         if (you < lastYou || opponent < lastOpponent || you > kGameHole || opponent > kGameHole)
             return "a score went down or past 121";
         std::tie(lastYou, lastOpponent) = std::pair(you, opponent);
+        // Every hole a peg moves is announced: the points the log has said add
+        // up to the score (which stops at 121).
+        const QStringList lines = LogLines(b);
+        for (; logSeen < lines.size(); ++logSeen)
+            for (auto [prefix, said] : {std::pair(QStringLiteral("You peg "), &saidYou), std::pair(QStringLiteral("Opponent pegs "), &saidOpponent)})
+                if (lines[logSeen].startsWith(prefix))
+                    *said += lines[logSeen].mid(prefix.size()).section(QLatin1Char(' '), 0, 0).section(QLatin1Char('.'), 0, 0).toInt();
+        if (std::min(saidYou, kGameHole) != you || std::min(saidOpponent, kGameHole) != opponent)
+            return QStringLiteral("the log announced %1 and %2 points, the pegs show %3 and %4").arg(saidYou).arg(saidOpponent).arg(you).arg(opponent);
         int total = 0;
         for (int i = 0; i < 9 && r.playSequence.entries[i] != -1; ++i)
             total += Rank1Value(r.playSequence.entries[i]);
@@ -272,6 +281,9 @@ private:
     // tally at its start.
     bool ended = false;
     int lastYou = 0, lastOpponent = 0;
+    // The log lines read so far and the points they announced.
+    qsizetype logSeen = 0;
+    int saidYou = 0, saidOpponent = 0;
     int32_t tallyFor = 0, tallyAgainst = 0;
     // The play when last seen, and the first rule of its turns broken.
     PlaySeen seen;
@@ -309,6 +321,7 @@ void SoakTest::wholeGames()
             b.NewGame();
         }
         std::tie(ended, lastYou, lastOpponent, tallyFor, tallyAgainst) = std::tuple(false, 0, 0, r.gamesFor, r.gamesAgainst);
+        std::tie(logSeen, saidYou, saidOpponent) = std::tuple(0, 0, 0);
         QCOMPARE(Check(), QString());
         QCOMPARE(LogLines(b).size(), 3);
     }
