@@ -198,18 +198,18 @@ private slots:
             << "Your hand = Five of Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Cards you laid | Count: 0 "
                "| Starter: Three of Hearts | Cards the opponent laid | Opponent's hand: 4 cards face down "
                "| Opponent's crib: 4 cards face down | Owner 0 · Opponent 0 · Opponent's crib";
-        QTest::newRow("the play: cards leave the hands for the rows; a go") << "ret 1 6 ret 2 3"
-            << "Your hand = Six of Clubs, Jack of Spades | Cards you laid = Five of Hearts, Five of Diamonds | Count: 27 "
+        QTest::newRow("the play: cards leave the hands for the rows; a go starts the count again") << "ret 1 6 ret 2 3"
+            << "Your hand = Six of Clubs, Jack of Spades | Cards you laid = Five of Hearts, Five of Diamonds | Count: 0 "
                "| Starter: Three of Hearts | Cards the opponent laid = Queen of Diamonds, Seven of Spades "
                "| Opponent's hand: 2 cards face down | Opponent's crib: 4 cards face down | Owner 0 · Opponent 3 · Opponent's crib";
         QTest::newRow("the show: both hands turned up") << play + " ret"
             << "Your hand = Five of Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Cards you laid = Five of "
-               "Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Count: 8 | Starter: Three of Hearts | Cards the "
+               "Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Count: none | Starter: Three of Hearts | Cards the "
                "opponent laid = Queen of Diamonds, Seven of Spades, Nine of Clubs, Eight of Hearts | Opponent's hand = "
                "Queen of Diamonds, Seven of Spades, Eight of Hearts, Nine of Clubs | Opponent's crib: 4 cards face down "
                "| Owner 1 · Opponent 6 · Opponent's crib";
         QTest::newRow("the crib face up, out of the rows") << play + " ret ret ret ret"
-            << "Your hand = Five of Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Cards you laid | Count: 8 "
+            << "Your hand = Five of Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Cards you laid | Count: none "
                "| Starter: Three of Hearts | Cards the opponent laid | Opponent's hand = Queen of Diamonds, Seven of Spades, "
                "Eight of Hearts, Nine of Clubs | Opponent's crib = Four of Clubs, King of Hearts, Ace of Spades, Two of "
                "Diamonds | Owner 7 · Opponent 19 · Opponent's crib";
