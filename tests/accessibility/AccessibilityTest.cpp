@@ -24,35 +24,23 @@ QString owner;
 void Record(QAccessibleEvent* event)
 {
     QAccessibleInterface* item = event->accessibleInterface();
-    if (item == nullptr)
+    // Qt's own widgets raise theirs themselves; the table's items have no object.
+    if (item == nullptr || (event->object() != nullptr && event->type() != QAccessible::Focus))
         return;
     QString name = item->text(QAccessible::Name).replace(owner, QStringLiteral("Owner"));
-    // A card is named with its part, which the screen reader reads it in.
-    if (item->role() == QAccessible::ListItem && item->parent())
-        name = item->parent()->text(QAccessible::Name) + QLatin1Char('/') + name;
+    // A card is named with its part, which the screen reader reads it in; an
+    // emptied place by its part alone.
+    if (item->role() == QAccessible::ListItem)
+        name = item->parent()->text(QAccessible::Name) + (name.isEmpty() ? QString() : '/' + name);
     switch (event->type()) {
     case QAccessible::Focus: seen.append("focus " + name); break;
-    // Qt's own widgets raise the rest for themselves; the table's items have no object.
-    case QAccessible::ObjectCreated:
-        if (!event->object())
-            seen.append("created " + name);
-        break;
-    case QAccessible::ObjectDestroyed:
-        // The place is empty now: only its part tells where it was.
-        if (!event->object())
-            seen.append("destroyed " + item->parent()->text(QAccessible::Name));
-        break;
+    case QAccessible::ObjectCreated: seen.append("created " + name); break;
+    case QAccessible::ObjectDestroyed: seen.append("destroyed " + name); break;
+    case QAccessible::StateChanged: seen.append((item->state().checked ? "checked " : "unchecked ") + name); break;
+    case QAccessible::ObjectShow: seen.append("say " + name); break;
     case QAccessible::NameChanged:
-        if (!event->object() && item->role() != QAccessible::Notification)
+        if (item->role() != QAccessible::Notification)
             seen.append("name " + name);
-        break;
-    case QAccessible::StateChanged:
-        if (!event->object() && static_cast<QAccessibleStateChangeEvent*>(event)->changedStates().checked)
-            seen.append((item->state().checked ? "checked " : "unchecked ") + name);
-        break;
-    case QAccessible::ObjectShow:
-        if (item->role() == QAccessible::Notification)
-            seen.append("say " + name);
         break;
     default: break;
     }
