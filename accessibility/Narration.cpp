@@ -78,10 +78,11 @@ void GameBoard::FocusCardByKey(int position)
     TableAccessible* table = Table(this);
     if (table == nullptr)
         return;
-    // The card stays in the hand when chosen or refused; laid, it is in the row.
+    // The card stays in its place when chosen or refused; laid, it is in the
+    // row (also the last card, which the show then lists in the hand again).
     const int slot = position - 1;
     TableItem* target = table->Item(TablePart::YourHand, slot);
-    for (int i = 0; i < 4 && !target->Shown(); ++i) {
+    for (int i = 0; i < 4 && record.playerHandSprites[slot].suit1 == kSuitEmpty; ++i) {
         const TableAccessible::Face laid = table->FaceAt(TablePart::YourLaid, i);
         if (laid.suit1 == CardSuit(record.deal[slot]) + 1 && laid.rank1 == CardRank(record.deal[slot]) + 1)
             target = table->Item(TablePart::YourLaid, i);

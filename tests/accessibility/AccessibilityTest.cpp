@@ -254,6 +254,16 @@ private slots:
         QCOMPARE(seen, expected);
     }
 
+    // A card laid by key whose turn ends the play keeps the focus in its row,
+    // though the show lists it in the hand again.
+    void focusOnTheCardThatEndsThePlay()
+    {
+        auto board = DealtBoard();
+        Play(*board, "ret 1 6 ret 2 5 4 ret 3");
+        QCOMPARE(board->record.phase, int(kPhasePlayOver));
+        QCOMPARE(seen.filter(QRegularExpression("^focus ")).last(), QString("focus Cards you laid/Five of Diamonds"));
+    }
+
     // Every turn of one deal played by keys, as it is said: the start, the
     // deal, each card chosen, the starter, each card laid with the count, the
     // log's lines, the hands and the crib turned up, and the buttons.
