@@ -52,6 +52,7 @@ void GameBoard::DealHand()
     }
     SyncCardSprites();
     ChooseComputerDiscards();
+    AnnounceTable(Turned::Deal);
 }
 
 void GameBoard::SortByRank(int first, int last)
@@ -84,6 +85,7 @@ void GameBoard::OnSendToCrib()
     for (int i = 1; i <= 4; ++i)
         r.playerHandSprites[i].suit1 = CardSuit(r.deal[i]) + 1;
     SyncCardSprites();
+    AnnounceTable(Turned::Starter);
     if (r.opponentDiscarded)
         StartPlay();
     SetButtonShown(sendToCribButton, false);

@@ -179,6 +179,26 @@ signals:
 
 public:
 
+    // --- accessibility/: the table as a screen reader presents it. Each of
+    // these returns at once while no assistive technology listens.
+    // Says a line wherever the screen reader's focus is; the lines of one turn
+    // of the event loop are said together, after the table's own events.
+    void Announce(const QString& text);
+    // What the table has just turned up, put into words and announced.
+    enum class Turned { Deal, Choice, Starter, Laid, Hand, Crib };
+    // which: the hand position (Choice) or the side (Laid, Hand).
+    void AnnounceTable(Turned what, int which = 0);
+    // A button that appears is what Enter presses next: said last, if it is
+    // still shown at the end of the turn.
+    void AnnounceButton(QPushButton* button);
+    // The table's looks changed: its accessible tree follows once per turn of
+    // the event loop, as the paint does.
+    void AccessibleTableChanged();
+    // The card of a hand position (1..6) that a key took gets the accessible focus.
+    void FocusCardByKey(int position);
+    // "Five of Hearts"; empty for a place that shows no face.
+    static QString CardWords(const CardSprite& sprite);
+
 protected:
     void paintEvent(QPaintEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;

@@ -144,8 +144,10 @@ void GameBoard::OnKeyDown(int key)
 {
     if (record.firstPaintPending)
         return;
-    if (const int p = HandPositionKey(key))
+    if (const int p = HandPositionKey(key)) {
         OnCardTap(p, record.playerHandSprites[p - 1]);
+        FocusCardByKey(p);
+    }
 }
 
 void GameBoard::OnKeyUp(int key)
@@ -173,6 +175,7 @@ void GameBoard::OnCardTap(int position, CardSprite& sprite)
             selected = selected ? 0 : 1;
             sprite.highlighted = selected;
             Invalidate(sprite.rect);
+            AnnounceTable(Turned::Choice, position);
             SetButtonShown(sendToCribButton, SelectedCount() == 2);
         }
     } else if (r.phase == kPhasePlay) {
@@ -210,8 +213,11 @@ bool GameBoard::IsButtonShown(int id) const
 
 void GameBoard::SetButtonShown(QPushButton* button, bool shown)
 {
-    if (button != nullptr)
+    if (button != nullptr) {
+        if (shown && button->isHidden())
+            AnnounceButton(button);
         button->setVisible(shown);
+    }
     NoteStatusChange();
 }
 

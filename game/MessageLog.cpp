@@ -10,6 +10,7 @@ void GameBoard::LogMessage(const QString& text)
     messageLog->addItem(text);
     messageLog->scrollToBottom();
     NoteStatusChange();
+    Announce(text);
 }
 
 void GameBoard::LogReasons(const QList<ScoreItem>& reasons)

@@ -68,6 +68,7 @@ void GameBoard::PlayerPlaysCard(int rank1)
     record.runningCount += Rank1Value(rank1);
     record.lastToPlay = kSidePlayer;
     SequenceAppend(record.playSequence, rank1);
+    AnnounceTable(Turned::Laid, kSidePlayer);
     PegPoints(kSidePlayer, ScorePlay(record.playSequence), QString(), ItemisePlay(record.playSequence));
     RefreshCount();
     if (record.runningCount == kMaxCount)
@@ -135,6 +136,7 @@ void GameBoard::ComputerPlaysCard(int rank1)
     record.runningCount += Rank1Value(rank1);
     SequenceAppend(record.playSequence, rank1);
     record.lastToPlay = kSideOpponent;
+    AnnounceTable(Turned::Laid, kSideOpponent);
     RefreshCount();
     PegPoints(kSideOpponent, ScorePlay(record.playSequence), QString(), ItemisePlay(record.playSequence));
 }

@@ -109,6 +109,7 @@ QPoint GameBoard::DevicePoint(QPointF point) const
 
 void GameBoard::Invalidate(const Rect& r)
 {
+    AccessibleTableChanged();
     // Before the first paint nothing is on screen, and that paint draws everything.
     if (record.firstPaintPending)
         return;
@@ -154,6 +155,7 @@ void GameBoard::CreateActionButtons()
 
     messageLog = new QListWidget(this);
     messageLog->setObjectName(QStringLiteral("MessageLog"));
+    messageLog->setAccessibleName(QStringLiteral("Messages"));
     messageLog->setFocusPolicy(Qt::NoFocus);
     messageLog->setSelectionMode(QAbstractItemView::NoSelection);
     // A line longer than the list is wide (a long reasons line, a path) wraps

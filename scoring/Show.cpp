@@ -15,6 +15,7 @@ void ScoreHand(GameBoard& board, int side, int firstSlot, const QString& suffix,
     GameRecord& r = board.record;
     const CardId* hand = r.deal + firstSlot;
     const CardId cards[5] = {hand[0], hand[1], hand[2], hand[3], r.deal[12]};
+    board.AnnounceTable(GameBoard::Turned::Hand, side);
     board.PegPoints(side, board.CountHand(cards), suffix, board.HandReasons(cards));
     if (!GameWon(board)) {
         if (r.phase == kPhaseHandCounted)
@@ -56,6 +57,7 @@ void GameBoard::ScoreCrib()
         Invalidate(otherRow[i].rect);
     }
 
+    AnnounceTable(Turned::Crib);
     PegPoints(playersCrib ? kSidePlayer : kSideOpponent, points, QStringLiteral(" for the crib"), HandReasons(cards));
     SetButtonShown(ActionButton(kCmdScoreCrib), false);
     if (!GameWon(*this))

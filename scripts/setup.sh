@@ -2,7 +2,7 @@
 # Installs the Debian packages the build needs, only those that are missing.
 set -euo pipefail
 
-packages=(cmake g++ ninja-build qt6-base-dev qt6-base-dev-tools qt6-qpa-plugins fonts-dejavu-core
+packages=(cmake g++ ninja-build qt6-base-dev qt6-base-dev-tools qt6-base-private-dev qt6-qpa-plugins fonts-dejavu-core
           appstream desktop-file-utils "$@")
 missing=()
 for p in "${packages[@]}"; do

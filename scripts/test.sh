@@ -15,6 +15,7 @@ cmake -S . -B build/check -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo -DVENNICK_W
 cmake --build build/check -j "$jobs"
 echo "== Test suite"
 ctest --test-dir build/check --output-on-failure -j "$jobs"
+bash scripts/atspi-check.sh build/check/vennick
 
 echo "== Installed desktop entry and AppStream metainfo"
 prefix=$(mktemp -d)

@@ -1,7 +1,9 @@
 #include "shell/GameApp.h"
 
+#include "accessibility/TableAccessible.h"
 #include "shell/MainFrame.h"
 
+#include <QAccessible>
 #include <QIcon>
 
 CGameApp::CGameApp(int& argc, char** argv)
@@ -15,6 +17,8 @@ CGameApp::CGameApp(int& argc, char** argv)
     for (int size : {16, 32, 256})
         icon.addFile(QStringLiteral(":/icons/vennick-%1.png").arg(size), QSize(size, size));
     setWindowIcon(icon);
+    // Costs nothing until a screen reader asks for the game window.
+    QAccessible::installFactory(TableAccessibleFactory);
 }
 
 CGameApp::~CGameApp() = default;
