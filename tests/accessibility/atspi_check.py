@@ -55,19 +55,22 @@ def key(*names):
     subprocess.run(["xdotool", "key", "--delay", "60", *names], check=True)
 
 
-def main():
-    desktop = pyatspi.Registry.getDesktop(0)
+def focused_table(desktop):
+    """The game's card table once it has registered and holds the focus."""
     app = wait_for("application named Vennick on the accessibility bus",
                    lambda: next((a for a in desktop if a is not None and a.name == "Vennick"), None))
     table = wait_for("card table in the game's tree", lambda: named(app, "Card table"))
-
     # Without a window manager the window gets the X focus from xdotool; keys
     # go to it once the screen reader's view says the table has the focus.
     window = subprocess.run(["xdotool", "search", "--sync", "--onlyvisible", "--name", "^Vennick$"],
                             check=True, capture_output=True, text=True, timeout=10).stdout.split()[0]
     subprocess.run(["xdotool", "windowfocus", "--sync", window], check=True, timeout=10)
     wait_for("focus on the card table", lambda: table.getState().contains(pyatspi.STATE_FOCUSED))
+    return table
 
+
+def main():
+    table = focused_table(pyatspi.Registry.getDesktop(0))
     key("Return")
     hand = named(table, "Your hand")
     cards = wait_for("six cards in your hand after Enter", lambda: len(children(hand)) == 6 and children(hand))

@@ -11,7 +11,7 @@ import time
 
 import pyatspi
 
-from atspi_check import children, fail, key, named, pump, wait_for
+from atspi_check import children, fail, focused_table, key, named, pump, wait_for
 
 
 def shown_buttons(table):
@@ -43,13 +43,7 @@ def main():
 
 
 def play(desktop):
-    app = wait_for("application named Vennick on the accessibility bus",
-                   lambda: next((a for a in desktop if a is not None and a.name == "Vennick"), None))
-    table = wait_for("card table in the game's tree", lambda: named(app, "Card table"))
-    window = subprocess.run(["xdotool", "search", "--sync", "--onlyvisible", "--name", "^Vennick$"],
-                            check=True, capture_output=True, text=True, timeout=10).stdout.split()[0]
-    subprocess.run(["xdotool", "windowfocus", "--sync", window], check=True, timeout=10)
-    wait_for("focus on the card table", lambda: table.getState().contains(pyatspi.STATE_FOCUSED))
+    table = focused_table(desktop)
     time.sleep(2)
 
     for keys in (["Return"], ["1"], ["2"], ["Return"]):
