@@ -115,7 +115,8 @@ private slots:
         QTest::keyClick(frame, Qt::Key_F1);
         QVERIFY(frame->HowToPlay() && !frame->HowToPlay()->isHidden() && !QApplication::activeModalWidget());
         QVERIFY(frame->HowToPlay()->Browser()->toPlainText().contains(QStringLiteral("His Heels")));
-        frame->HowToPlay()->close();
+        QTest::mouseClick(frame->HowToPlay()->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Close), Qt::LeftButton);
+        QVERIFY(frame->HowToPlay()->isHidden());
         // Ctrl+Q ends the program's own loop; 7 should nothing end it within five seconds.
         QTimer::singleShot(0, frame, [frame] { QTest::keyClick(frame, Qt::Key_Q, Qt::ControlModifier); });
         QTimer::singleShot(5000, frame, [] { QCoreApplication::exit(7); });
