@@ -151,8 +151,10 @@ private slots:
         Play(*board, "ret");
         QAccessibleInterface* table = QAccessible::queryAccessibleInterface(board.get());
         QStringList roles;
-        for (int i = 0; i < table->childCount(); ++i)
+        for (int i = 0; i < table->childCount(); ++i) {
             roles.append(QString::number(table->child(i)->role(), 16) + ' ' + table->child(i)->text(QAccessible::Name));
+            QCOMPARE(table->indexOfChild(table->child(i)), i);  // a client's way back from each child
+        }
         QCOMPARE(table->text(QAccessible::Name) + ' ' + QString::number(table->role(), 16), QString("Card table 10"));
         QCOMPARE(roles.mid(0, 3), (QStringList{"21 Your hand", "21 Cards you laid", "29 Count: none"}));
         QCOMPARE(roles.mid(8), (QStringList{"2b Deal", "2b Send To Crib", "2b Score Player's Hand",
