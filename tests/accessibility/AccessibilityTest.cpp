@@ -180,10 +180,6 @@ private slots:
             << "Your hand = [ ] Four of Clubs, [ ] Five of Hearts, [ ] Five of Diamonds, [ ] Six of Clubs, [ ] Jack of "
                "Spades, [ ] King of Hearts | Cards you laid | Count: none | Starter: face down | Cards the opponent laid "
                "| Opponent's hand: 4 cards face down | Opponent's crib: 2 cards face down | Owner 0 · Opponent 0 · Opponent's crib";
-        QTest::newRow("two chosen") << "ret 1 6"
-            << "Your hand = [x] Four of Clubs, [ ] Five of Hearts, [ ] Five of Diamonds, [ ] Six of Clubs, [ ] Jack of "
-               "Spades, [x] King of Hearts | Cards you laid | Count: none | Starter: face down | Cards the opponent laid "
-               "| Opponent's hand: 4 cards face down | Opponent's crib: 2 cards face down | Owner 0 · Opponent 0 · Opponent's crib";
         QTest::newRow("sent: the starter turned, the count shown") << "ret 1 6 ret"
             << "Your hand = Five of Hearts, Five of Diamonds, Six of Clubs, Jack of Spades | Cards you laid | Count: 0 "
                "| Starter: Three of Hearts | Cards the opponent laid | Opponent's hand: 4 cards face down "

@@ -159,11 +159,6 @@ void PlayTest::deal_data()
         << "You peg 2. / Opponent pegs 1 for a go. | 0-2 0-1 | none | 4 | Score your hand";
     QTest::newRow("computer's 31 laid two cards at once; the user leads; user's go")
         << runsTo31 << false << "2S 8D TH QC" << "Opponent pegs 2. / You peg 1 for a go. | 0-1 0-2 | none | 4 | Score your hand";
-    // A new count shows 0 at once, not the old total.
-    QTest::newRow("0 shown after the user's 31, while Ok waits")
-        << "2S 4S 8S QS 9H TH 7D KD 7H 7C 3C 6C 5D" << false << "2S 4S 8S QS" << "You peg 2. | 0-2 122-0 | 0 | 6 | Press Ok";
-    QTest::newRow("0 shown after the user's go, while Ok waits") << repeatedGo << false << "kKH k7D kAS k2S"
-        << go + go + "You peg 1 for a go. | 0-1 122-0 | 0 | 6 | Press Ok";
     QTest::newRow("go repeated until the user pegs it, by keyboard") << repeatedGo << false << "kKH k7D kAS k2S ret"
         << go + go + "You peg 1 for a go. / Opponent pegs 1 for a go. | 0-1 0-1 | none | 4 | Score your hand";
     QTest::newRow("computer's last card announces its go after its own points")
