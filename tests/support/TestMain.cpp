@@ -25,21 +25,14 @@ bool RegisterTestClass(const QMetaObject& meta, std::function<int(int, char**)> 
 
 namespace {
 
-// The test functions named on the command line ("function" or
-// "function:data tag"); the values of Qt Test's options are not names.
+// The test functions named on the command line ("function" or "function:data
+// tag"); an option's value taken for a name matches no function.
 QList<QByteArray> NamedFunctions(const std::vector<char*>& args)
 {
-    static const QByteArrayList kOptionsWithValue = {"-o", "-maxwarnings", "-eventdelay", "-keydelay", "-mousedelay",
-                                                     "-seed", "-repeat", "-iterations", "-median", "-minimumvalue",
-                                                     "-minimumtotal", "-perfcounter", "-callgrindbasedir"};
     QList<QByteArray> names;
-    for (size_t i = 1; i < args.size(); ++i) {
-        const QByteArray arg(args[i]);
-        if (kOptionsWithValue.contains(arg))
-            ++i;
-        else if (!arg.startsWith('-'))
-            names.append(arg.split(':').first() + "()");
-    }
+    for (size_t i = 1; i < args.size(); ++i)
+        if (args[i][0] != '-')
+            names.append(QByteArray(args[i]).split(':').first() + "()");
     return names;
 }
 
