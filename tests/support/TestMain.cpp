@@ -10,39 +10,29 @@
 #include <vector>
 
 // Constant-initialised, so they exist before any test file registers.
-struct TestClass {
-    const QMetaObject* meta;
-    std::function<int(int, char**)> run;
-};
-constinit static std::vector<TestClass> registry;
+constinit static std::vector<std::pair<const QMetaObject*, std::function<int(int, char**)>>> registry;
 constinit static std::chrono::milliseconds functionTimeAllowed{0};
 
 bool RegisterTestClass(const QMetaObject& meta, std::function<int(int, char**)> run)
 {
-    registry.push_back({&meta, std::move(run)});
+    registry.emplace_back(&meta, std::move(run));
     return true;
 }
 
-namespace {
-
-// The test functions named on the command line ("function" or "function:data
-// tag"); an option's value taken for a name matches no function.
-QList<QByteArray> NamedFunctions(const std::vector<char*>& args)
+// Whether a class runs: it has a function named on the command line
+// ("function" or "function:tag"), or none is named.
+static bool Runs(const QMetaObject& meta, const std::vector<char*>& args)
 {
-    QList<QByteArray> names;
-    for (size_t i = 1; i < args.size(); ++i)
-        if (args[i][0] != '-')
-            names.append(QByteArray(args[i]).split(':').first() + "()");
-    return names;
+    bool named = false;
+    for (size_t i = 1; i < args.size(); ++i) {
+        if (args[i][0] == '-')
+            continue;  // an option's value taken for a name matches no function
+        named = true;
+        if (meta.indexOfSlot(QByteArray(args[i]).split(':').first() + "()") >= 0)
+            return true;
+    }
+    return !named;
 }
-
-bool HasAny(const QMetaObject& meta, const QList<QByteArray>& functions)
-{
-    return std::any_of(functions.begin(), functions.end(),
-                       [&meta](const QByteArray& f) { return meta.indexOfSlot(f.constData()) >= 0; });
-}
-
-} // namespace
 
 bool AllowFunctionTime(std::chrono::milliseconds limit)
 {
@@ -70,14 +60,11 @@ int main(int argc, char** argv)
     std::vector<char*> args(argv, argv + argc);
     char noCrashHandler[] = "-nocrashhandler";
     args.push_back(noCrashHandler);
-    // Only the classes that have a function named; when none has, all run,
-    // and Qt Test says what was not found.
-    const QList<QByteArray> named = NamedFunctions(args);
-    const bool anyKnown = std::any_of(registry.begin(), registry.end(),
-                                      [&named](const TestClass& c) { return HasAny(*c.meta, named); });
+    // When no class has a function named, all run, and Qt Test says so.
+    const bool anyRuns = std::any_of(registry.begin(), registry.end(), [&args](const auto& c) { return Runs(*c.first, args); });
     int failed = 0;
-    for (const TestClass& c : registry)
-        if (!anyKnown || HasAny(*c.meta, named))
-            failed += c.run(static_cast<int>(args.size()), args.data()) != 0;
+    for (const auto& [meta, run] : registry)
+        if (!anyRuns || Runs(*meta, args))
+            failed += run(static_cast<int>(args.size()), args.data()) != 0;
     return failed == 0 ? 0 : 1;
 }

@@ -15,8 +15,8 @@ bool RegisterTestClass(const QMetaObject& meta, std::function<int(int, char**)> 
 bool AllowFunctionTime(std::chrono::milliseconds limit);
 
 #define VENNICK_TEST(Class)                                                                  \
-    static const bool vennickRegistered##Class = RegisterTestClass(Class::staticMetaObject,     \
-                                                                   [](int argc, char** argv) { \
-                                                                       Class test;             \
-                                                                       return QTest::qExec(&test, argc, argv); \
-                                                                   })
+    static const bool vennickRegistered##Class =                                             \
+        RegisterTestClass(Class::staticMetaObject, [](int argc, char** argv) {               \
+            Class test;                                                                      \
+            return QTest::qExec(&test, argc, argv);                                          \
+        })
