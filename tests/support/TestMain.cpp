@@ -26,8 +26,8 @@ static bool Runs(const QMetaObject& meta, const std::vector<char*>& args)
     bool named = false;
     for (size_t i = 1; i < args.size(); ++i) {
         if (args[i][0] == '-')
-            continue;  // an option's value taken for a name matches no function
-        named = true;
+            continue;
+        named = true;  // also an option's value, which matches no function
         if (meta.indexOfSlot(QByteArray(args[i]).split(':').first() + "()") >= 0)
             return true;
     }
